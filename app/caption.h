@@ -1,0 +1,24 @@
+#pragma once
+
+#include <string>
+
+// The main window's caption, which long file operations use as their progress line.
+class Caption {
+public:
+  virtual ~Caption() = default;
+  virtual std::string Get() const = 0;
+  virtual void Set(const std::string &text) = 0;
+};
+
+// Restores the caption it found when it goes out of scope.
+class CaptionRestorer {
+public:
+  explicit CaptionRestorer(Caption &caption) : caption_(caption), saved_(caption.Get()) {}
+  ~CaptionRestorer() { caption_.Set(saved_); }
+  CaptionRestorer(const CaptionRestorer &) = delete;
+  CaptionRestorer &operator=(const CaptionRestorer &) = delete;
+
+private:
+  Caption &caption_;
+  std::string saved_;
+};

@@ -1,0 +1,21 @@
+#include "app/failures.h"
+
+#include "app/names.h"
+
+#include <algorithm>
+
+void Failures::Add(const std::filesystem::path &path, const std::string &reason) {
+  Add(DisplayPath(path) + ": " + reason);
+}
+
+void Failures::Add(const std::string &text) {
+  if (std::find(lines_.begin(), lines_.end(), text) == lines_.end())
+    lines_.push_back(text);
+}
+
+std::string Failures::Message(const std::string &heading) const {
+  std::string text = heading;
+  for (const std::string &line : lines_)
+    text += "\n" + line;
+  return text;
+}

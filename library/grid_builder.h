@@ -1,0 +1,15 @@
+#pragma once
+
+#include "library/folder_grid.h"
+
+#include <filesystem>
+#include <string>
+#include <string_view>
+#include <vector>
+
+// Whether a library folder name is reserved ("AUTOSCRIPTS", "SKINFOLDER", "UNUSED", any case).
+bool IsReservedFolder(std::string_view name);
+// Replaces the grid's folder rows: for each category letter in file order, every library folder
+// whose name starts with that letter, in name order. The header row stays.
+void BuildFolderRows(FolderGrid &grid, const std::vector<std::string> &codes,
+                     const std::vector<std::filesystem::path> &libraryFolders);

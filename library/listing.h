@@ -1,0 +1,18 @@
+#pragma once
+
+#include <filesystem>
+#include <string>
+#include <string_view>
+#include <vector>
+
+// Whether `name` matches the wildcard `pattern` ("*" any run, "?" one character), ignoring case;
+// "*.*" matches every name, also one without a dot.
+bool MatchesPattern(std::string_view name, std::string_view pattern);
+// Whether `name` matches any pattern of a ";"-separated list.
+bool MatchesPatternList(std::string_view name, std::string_view patterns);
+// Plain file names (no path) directly in `folder` that match the pattern list, in name order.
+// A folder that cannot be listed gives no names.
+std::vector<std::string> ListFiles(const std::filesystem::path &folder,
+                                   std::string_view patterns = "*.*");
+// Full paths of the immediate subfolders of `folder`, in name order.
+std::vector<std::filesystem::path> ListFolders(const std::filesystem::path &folder);

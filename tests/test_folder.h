@@ -1,0 +1,31 @@
+#pragma once
+
+#include <filesystem>
+#include <string>
+
+// A fresh folder under the system's temporary folder, removed with everything in it at the end.
+class TestFolder {
+public:
+  TestFolder();
+  ~TestFolder();
+  TestFolder(const TestFolder &) = delete;
+  TestFolder &operator=(const TestFolder &) = delete;
+
+  const std::filesystem::path &Path() const { return path_; }
+  // Writes `bytes` to `relative`, creating the folders on the way.
+  std::filesystem::path Write(const std::string &relative, const std::string &bytes = "x") const;
+  // Creates the folder `relative` and those on the way.
+  std::filesystem::path MakeFolder(const std::string &relative) const;
+  bool Exists(const std::string &relative) const;
+  std::string Read(const std::string &relative) const;
+
+private:
+  std::filesystem::path path_;
+};
+
+// Whether `path` can be written to by its owner.
+bool IsWritable(const std::filesystem::path &path);
+// Makes `path` read-only (or writable again).
+void SetReadOnly(const std::filesystem::path &path, bool readOnly);
+// Whether the tests run with the power to ignore file permissions (root).
+bool PermissionsAreIgnored();

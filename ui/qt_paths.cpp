@@ -1,0 +1,17 @@
+#include "ui/qt_paths.h"
+
+#include <QFile>
+
+namespace fs = std::filesystem;
+
+#ifdef _WIN32
+fs::path ToPath(const QString &text) { return fs::path(text.toStdWString()); }
+QString FromPath(const fs::path &path) { return QString::fromStdWString(path.wstring()); }
+QString FromName(const std::string &name) { return QString::fromUtf8(name); }
+std::string ToName(const QString &text) { return text.toStdString(); }
+#else
+fs::path ToPath(const QString &text) { return fs::path(QFile::encodeName(text).toStdString()); }
+QString FromPath(const fs::path &path) { return QFile::decodeName(path.string().c_str()); }
+QString FromName(const std::string &name) { return QFile::decodeName(name.c_str()); }
+std::string ToName(const QString &text) { return QFile::encodeName(text).toStdString(); }
+#endif

@@ -1,0 +1,3 @@
+#include "ui/run_selector.h"
+
+int RunSelector(const std::filesystem::path &) { return 0; }
