@@ -55,8 +55,7 @@ Categories ParseCategories(const std::vector<std::string> &lines) {
   for (size_t i = 0; i < lines.size(); ++i) {
     const std::string &line = lines[i];
     const size_t colon = line.find(':');
-    const bool full = categories.codes.size() >= kMaxCategories;
-    if (colon == std::string::npos || full) {
+    if (colon == std::string::npos || i >= kMaxCategories) {
       categories.skipped.push_back({static_cast<int>(i + 1), line});
       continue;
     }

@@ -1,0 +1,127 @@
+#include "app/category_file.h"
+#include "app/instance_lock_qt.h"
+#include "tests/test_folder.h"
+#include "tests/window_driver.h"
+#include "ui/duplicate_instance.h"
+#include "ui/run_selector.h"
+
+#include <QApplication>
+#include <QLabel>
+#include <QMessageBox>
+#include <QPlainTextEdit>
+#include <QPushButton>
+#include <QTest>
+#include <QTimer>
+#include <gtest/gtest.h>
+
+namespace fs = std::filesystem;
+
+TEST(StartupWindow, FirstStartCreatesTheLibraryAndShowsAnEmptyGrid) {
+  TestFolder game;
+  WindowDriver driver(game.Path());
+  EXPECT_EQ(game.Read("ZEP128/zep.ini"), DefaultCategoryText());
+  EXPECT_TRUE(game.Exists("ZEP128/FoldersLoaded.txt"));
+  EXPECT_EQ(fs::file_size(game.Path() / "ZEP128/FoldersLoaded.txt"), 0u);
+  EXPECT_EQ(driver.Grid()->model()->rowCount(), 0);
+  EXPECT_EQ(driver.Grid()->model()->headerData(1, Qt::Horizontal), "All folders are available");
+  auto *list = driver.Find<QListWidget>("List3");
+  ASSERT_EQ(list->count(), 29);
+  EXPECT_EQ(list->item(0)->text(), "Show ALL");
+  EXPECT_EQ(list->item(28)->text(), "Convoy Files");
+  EXPECT_TRUE(driver.TakeMessages().isEmpty());
+}
+
+TEST(StartupWindow, WindowHasItsCaptionControlsAndPages) {
+  TestFolder game;
+  WindowDriver driver(game.Path());
+  MainWindow &window = driver.Window();
+  EXPECT_EQ(window.windowTitle().size(), 108);
+  EXPECT_TRUE(window.windowTitle().startsWith("ZEP for 150 "));
+  EXPECT_TRUE(window.windowTitle().endsWith("Build: 22nd June 2016   #1"));
+  EXPECT_EQ(window.size(), QSize(999, 624));
+  auto *tabs = driver.Find<QTabWidget>("SSTab1");
+  EXPECT_EQ(tabs->tabText(0), "General Settings");
+  EXPECT_EQ(tabs->tabText(1), "World settings");
+  EXPECT_EQ(driver.Find<QPushButton>("delmsn")->toolTip(), "Deletes \"DefaultXXX.msn\"");
+  EXPECT_EQ(driver.Find<QPushButton>("IniEdit")->text(),
+            "Display \"eaw.ini' for inspection or further editing");
+  EXPECT_EQ(driver.Find<QLabel>("Label22")->text(),
+            "Click on a white row to load a folder, or click on a green row to unload it.");
+  EXPECT_FALSE(driver.Find<QWidget>("Frame21")->isVisible());
+  EXPECT_EQ(driver.Find<QLineEdit>("Text4")->text(), "0");
+  EXPECT_TRUE(driver.Grid()->isColumnHidden(0));
+  EXPECT_EQ(driver.Grid()->columnWidth(1), 333);
+  for (const char *name : {"Command1", "Command8", "Command3", "Label33", "List4", "MyImage",
+                           "Text9", "MyLabel", "Label11", "Label6", "SlotFrame", "Text14"})
+    EXPECT_NE(driver.Find<QWidget>(name), nullptr) << name;
+}
+
+TEST(StartupWindow, RecordedFoldersShowGreenAfterARestart) {
+  TestFolder game;
+  game.Write("ZEP128/zep.ini", "Skins: S\r\nSounds: N\r\n");
+  game.Write("ZEP128/S-one/a.dat");
+  game.Write("ZEP128/N-two/b.dat");
+  game.Write("ZEP128/FoldersLoaded.txt", "N-two\r\n\r\n");
+  WindowDriver driver(game.Path());
+  QAbstractItemModel *model = driver.Grid()->model();
+  ASSERT_EQ(model->rowCount(), 2);
+  EXPECT_EQ(model->index(1, 1).data().toString(), "N-two");
+  EXPECT_EQ(model->index(1, 2).data().toString(), "S");
+  EXPECT_EQ(model->index(1, 1).data(Qt::BackgroundRole).value<QColor>(), QColor(192, 255, 192));
+  EXPECT_FALSE(model->index(0, 1).data(Qt::BackgroundRole).isValid());
+  EXPECT_FALSE(game.Exists("b.dat"));
+  EXPECT_EQ(driver.Grid()->height(),
+            53 + driver.Grid()->style()->pixelMetric(QStyle::PM_ScrollBarExtent));
+}
+
+TEST(StartupWindow, UnreadableCategoryFileIsToldOnceAndTheWindowStillStarts) {
+  TestFolder game;
+  game.MakeFolder("ZEP128/zep.ini/in-the-way");
+  game.MakeFolder("ZEP128/S-one");
+  WindowDriver driver(game.Path());
+  const QStringList messages = driver.TakeMessages();
+  ASSERT_EQ(messages.size(), 1);
+  EXPECT_TRUE(messages[0].contains("zep.ini"));
+  EXPECT_EQ(driver.Grid()->model()->rowCount(), 1);
+}
+
+TEST(StartupWindow, ExitMinimiseAndPointerOverTheLoaderPage) {
+  TestFolder game;
+  WindowDriver driver(game.Path());
+  driver.Find<QLabel>("MyLabel")->setText("old preview");
+  driver.Find<QPlainTextEdit>("Text9")->setPlainText("kept");
+  QTest::mouseMove(driver.Find<QWidget>("LoadFrame"), QPoint(200, 3));
+  EXPECT_EQ(driver.Find<QLabel>("MyLabel")->text(), "");
+  EXPECT_EQ(driver.Find<QPlainTextEdit>("Text9")->toPlainText(), "kept");
+
+  QTest::mouseClick(driver.Find<QPushButton>("Command8"), Qt::LeftButton);
+  EXPECT_TRUE(driver.Window().windowState() & Qt::WindowMinimized);
+  QTest::mouseClick(driver.Find<QPushButton>("Command3"), Qt::LeftButton);
+  EXPECT_FALSE(driver.Window().isVisible());
+}
+
+TEST(StartupWindow, SecondInstanceIsRefusedAndTouchesNoFile) {
+  TestFolder game;
+  InstanceLock first(game.Path());
+  ASSERT_TRUE(first.Acquired());
+  QString title, text;
+  QMessageBox::Icon icon = QMessageBox::NoIcon;
+  int buttons = 0;
+  QTimer::singleShot(0, [&] {
+    auto *box = qobject_cast<QMessageBox *>(QApplication::activeModalWidget());
+    ASSERT_NE(box, nullptr);
+    title = box->windowTitle();
+    text = box->text();
+    icon = box->icon();
+    buttons = static_cast<int>(box->buttons().size());
+    box->button(QMessageBox::Ok)->click();
+  });
+  EXPECT_EQ(RunSelector(game.Path()), 0);
+  EXPECT_EQ(title, "Hang On...........");
+  EXPECT_EQ(text, DuplicateInstanceText());
+  EXPECT_EQ(text.count("\r\n"), 5);
+  EXPECT_TRUE(text.contains("once.\r\n\r\nYou have"));
+  EXPECT_EQ(icon, QMessageBox::Warning);
+  EXPECT_EQ(buttons, 1);
+  EXPECT_TRUE(fs::is_empty(game.Path()));
+}

@@ -1,0 +1,82 @@
+#include "app/existence.h"
+#include "app/text_file.h"
+#include "library/listing.h"
+#include "tests/test_folder.h"
+
+#include <gtest/gtest.h>
+
+namespace fs = std::filesystem;
+using Lines = std::vector<std::string>;
+
+TEST(TextFile, EveryKindOfLineEndEndsALine) {
+  EXPECT_EQ(SplitLines("a\r\nb\rc\nd"), (Lines{"a", "b", "c", "d"}));
+  EXPECT_EQ(SplitLines("a\r\n\r\nb\r\n"), (Lines{"a", "", "b"}));
+  EXPECT_EQ(SplitLines("\n\n"), (Lines{"", ""}));
+  EXPECT_EQ(SplitLines(""), Lines{});
+  EXPECT_EQ(SplitLines("x\xff\x01y"), Lines{"x\xff\x01y"});
+}
+
+TEST(TextFile, AtomicWriteReplacesWholeOrLeavesTheOldFile) {
+  TestFolder folder;
+  const fs::path target = folder.Write("record.txt", "old");
+  Failures failures;
+  EXPECT_TRUE(WriteAtomically(target, "new\r\n", failures));
+  EXPECT_EQ(folder.Read("record.txt"), "new\r\n");
+
+  // A folder holding the temporary name makes the write fail even for root.
+  folder.Write("record.txt.partial/keep", "");
+  EXPECT_FALSE(WriteAtomically(target, "newer", failures));
+  EXPECT_EQ(folder.Read("record.txt"), "new\r\n");
+  EXPECT_TRUE(folder.Exists("record.txt.partial/keep"));
+  ASSERT_EQ(failures.Lines().size(), 1u);
+  EXPECT_NE(failures.Lines()[0].find("record.txt"), std::string::npos);
+}
+
+TEST(Existence, FilesAndFoldersAreToldApart) {
+  TestFolder folder;
+  const fs::path file = folder.Write("eaw.ini");
+  FolderCheck(file);
+  EXPECT_FALSE(FolderFound);
+  FileCheck(folder.Path());
+  EXPECT_FALSE(FileFound);
+  FileCheck(file);
+  EXPECT_TRUE(FileFound);
+  FileCheck(folder.Path() / "missing");
+  EXPECT_FALSE(FileFound);
+  FolderCheck(folder.Path());
+  EXPECT_TRUE(FolderFound);
+}
+
+TEST(Listing, PatternsMatchLikeWindowsIgnoringCase) {
+  EXPECT_TRUE(MatchesPattern("mypic", "*.*"));
+  EXPECT_TRUE(MatchesPattern("PLANES.DAT", "*.dat"));
+  EXPECT_TRUE(MatchesPattern("pic1.bmp", "P*.BMP"));
+  EXPECT_FALSE(MatchesPattern("title.bmp", "P*.bmp"));
+  EXPECT_TRUE(MatchesPattern("MyPic", "mypic"));
+  EXPECT_FALSE(MatchesPattern("mypic.jpg", "mypic"));
+  EXPECT_TRUE(MatchesPattern("a1.txt", "a?.txt"));
+  EXPECT_FALSE(MatchesPattern("a12.txt", "a?.txt"));
+  EXPECT_TRUE(MatchesPatternList("skin.GIF", "mypic;skinpic;*.jpg;*.bmp;*.gif"));
+  EXPECT_FALSE(MatchesPatternList("skin.png", "mypic;;*.jpg"));
+  EXPECT_FALSE(MatchesPatternList("anything", ""));
+}
+
+TEST(Listing, FilesAndFoldersComeInOneNameOrder) {
+  TestFolder folder;
+  for (const char *name : {"b.dat", "A.dat", "a.DAT", "c.txt", "mypic"})
+    folder.Write(name);
+  folder.MakeFolder("sub.dat");
+  EXPECT_EQ(ListFiles(folder.Path(), "*.dat"), (Lines{"A.dat", "a.DAT", "b.dat"}));
+  EXPECT_EQ(ListFiles(folder.Path()), (Lines{"A.dat", "a.DAT", "b.dat", "c.txt", "mypic"}));
+  EXPECT_TRUE(ListFiles(folder.Path() / "missing").empty());
+
+  for (const char *name : {"S-b", "s-a", "C x", "F-z"})
+    folder.MakeFolder(std::string("lib/") + name);
+  folder.Write("lib/file");
+  const std::vector<fs::path> folders = ListFolders(folder.Path() / "lib");
+  std::vector<std::string> names;
+  for (const fs::path &path : folders)
+    names.push_back(path.filename().string());
+  EXPECT_EQ(names, (Lines{"C x", "F-z", "s-a", "S-b"}));
+  EXPECT_EQ(folders[0], folder.Path() / "lib" / "C x");
+}

@@ -1,0 +1,35 @@
+#include "tests/window_driver.h"
+
+#include <QApplication>
+#include <QMessageBox>
+#include <QTest>
+
+WindowDriver::WindowDriver(const std::filesystem::path &eawDir)
+    : window_(std::make_unique<MainWindow>(eawDir)) {
+  window_->FormLoad();
+  window_->show();
+  window_->findChild<QTabWidget *>("SSTab1")->setCurrentIndex(1);
+  QApplication::processEvents();
+}
+
+void WindowDriver::ClickRow(int row, int column) {
+  QTableView *grid = Grid();
+  const QModelIndex index = grid->model()->index(row - 1, column);
+  grid->scrollTo(index);
+  QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, grid->visualRect(index).center());
+}
+
+void WindowDriver::PressGridKey(int key) { QTest::keyClick(Grid(), static_cast<Qt::Key>(key)); }
+
+QStringList WindowDriver::TakeMessages() {
+  QApplication::processEvents();
+  QStringList texts;
+  for (QMessageBox *box : window_->findChildren<QMessageBox *>()) {
+    if (!box->isVisible())
+      continue;
+    texts << box->text();
+    box->close();
+  }
+  QApplication::processEvents();
+  return texts;
+}

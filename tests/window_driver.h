@@ -1,0 +1,28 @@
+#pragma once
+
+#include "ui/main_window.h"
+
+#include <QStringList>
+#include <QTableView>
+#include <memory>
+
+// A started main window for a game folder, and the few ways a person works it.
+class WindowDriver {
+public:
+  explicit WindowDriver(const std::filesystem::path &eawDir);
+
+  MainWindow &Window() { return *window_; }
+  template <class Widget> Widget *Find(const char *name) {
+    return window_->findChild<Widget *>(name);
+  }
+  QTableView *Grid() { return Find<QTableView>("Unigrid"); }
+  // Clicks the name cell of folder row `row` (1 is the first folder).
+  void ClickRow(int row, int column = 1);
+  // Types a key into the folder grid.
+  void PressGridKey(int key);
+  // The texts of the message boxes the window has shown since the last call; closes them.
+  QStringList TakeMessages();
+
+private:
+  std::unique_ptr<MainWindow> window_;
+};
