@@ -13,6 +13,7 @@
 #include <iostream>
 #include <string>
 #include <system_error>
+#include <utility>
 #include <vector>
 
 namespace fs = std::filesystem;
@@ -120,7 +121,6 @@ class DemoWriter {
 public:
   explicit DemoWriter(fs::path root) : root_(std::move(root)) {}
 
-  const fs::path &Root() const { return root_; }
   bool Failed() const { return failures_ > 0; }
 
   void Folder(const fs::path &relative) {
