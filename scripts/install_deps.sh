@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs the Debian packages the build, the tests and the demo need; does nothing when all are there.
 set -euo pipefail
-packages=(cmake g++ make qt6-base-dev libgtest-dev libbenchmark-dev xvfb xauth)
+packages=(cmake g++ make qt6-base-dev libgtest-dev libbenchmark-dev xvfb xauth fonts-liberation2)
 missing=()
 for p in "${packages[@]}"; do
   dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q "install ok installed" || missing+=("$p")

@@ -1,3 +1,19 @@
 #include "ui/run_selector.h"
 
-int RunSelector(const std::filesystem::path &) { return 0; }
+#include "app/instance_lock_qt.h"
+#include "ui/duplicate_instance.h"
+#include "ui/main_window.h"
+
+#include <QApplication>
+
+int RunSelector(const std::filesystem::path &eawDir) {
+  InstanceLock lock(eawDir);
+  if (!lock.Acquired()) {
+    ShowDuplicateInstanceMessage();
+    return 0;
+  }
+  MainWindow window(eawDir);
+  window.FormLoad();
+  window.show();
+  return QApplication::exec();
+}

@@ -1,0 +1,18 @@
+#pragma once
+
+#include <QLockFile>
+#include <filesystem>
+#include <memory>
+
+// Holds the one-instance lock of a game folder; a lock left by a crashed instance is stale and
+// taken over.
+class InstanceLock {
+public:
+  explicit InstanceLock(const std::filesystem::path &eawDir);
+  // Whether this is the only running instance for the game folder.
+  bool Acquired() const { return acquired_; }
+
+private:
+  std::unique_ptr<QLockFile> lock_;
+  bool acquired_ = false;
+};

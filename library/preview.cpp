@@ -1,0 +1,44 @@
+#include "library/preview.h"
+
+#include "app/failures.h"
+#include "app/names.h"
+#include "app/text_file.h"
+#include "library/listing.h"
+
+namespace fs = std::filesystem;
+
+bool EnterHoverRow(AppState &state, int row) {
+  if (row == state.HoverRow)
+    return false;
+  state.HoverRow = row;
+  return true;
+}
+
+static std::string Description(const fs::path &file) {
+  // A description is a courtesy: one that cannot be read just leaves the preview empty.
+  Failures ignored;
+  const auto lines = ReadLines(file, ignored);
+  return lines ? JoinCrLf(*lines) : "";
+}
+
+FolderPreview PreviewOf(const fs::path &folder) {
+  FolderPreview preview;
+  // One listing serves both the description (any letter case) and the picture.
+  const std::string patterns = std::string("contents.txt;") + kPicturePatterns;
+  bool described = false;
+  for (const std::string &name : ListFiles(folder, patterns)) {
+    if (!described && Upper(name) == "CONTENTS.TXT") {
+      preview.description = Description(Child(folder, name));
+      described = true;
+    } else if (preview.picture.empty() && MatchesPatternList(name, kPicturePatterns)) {
+      preview.picture = Child(folder, name);
+    }
+  }
+  return preview;
+}
+
+FolderPreview PreviewOfRow(const AppState &state, int row) {
+  if (row < 1 || row >= state.Unigrid.RowCount())
+    return {};
+  return PreviewOf(state.Unigrid.rows[static_cast<size_t>(row)].path);
+}

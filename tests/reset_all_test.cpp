@@ -1,0 +1,83 @@
+#include "library/reset_all.h"
+
+#include "library/listing.h"
+#include "library/refresh.h"
+#include "tests/recording_caption.h"
+#include "tests/test_folder.h"
+
+#include <gtest/gtest.h>
+
+namespace fs = std::filesystem;
+
+using Names = std::vector<std::string>;
+
+// The game folder of the usual example, a few more names, and a library with one loaded folder.
+static void MakeGame(const TestFolder &game) {
+  for (const char *name : {"planes.dat", "hof.dat", "readme.txt", "chatline.txt", "pic1.bmp",
+                           "title.bmp", "dsg.ico", "eaw.exe", "mypic", "Extra.Spt",
+                           "Savedata/a.dat", "old.dat/inside.txt", "ZEP128/S-Camo/a.txt"})
+    game.Write(name);
+  game.Write("ZEP128/zep.ini", "Skins: S\r\n");
+  game.Write("ZEP128/FoldersLoaded.txt", "S-Camo\r\n\r\n");
+}
+
+TEST(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
+  TestFolder game;
+  MakeGame(game);
+  AppState state = StateFor(game.Path());
+  state.GridBackColor = 0xFFFFFF;
+  RecordingCaption caption;
+  Failures failures;
+  Label33Click(state, caption, failures);
+  ASSERT_EQ(state.Unigrid.rows[1].mark, "S");
+  state.Slots.frameVisible = true;
+  state.Ready = false;
+
+  for (int time = 0; time < 2; ++time) {
+    Command1Click(state, caption, failures);
+    EXPECT_EQ(ListFiles(game.Path()),
+              (Names{"chatline.txt", "dsg.ico", "eaw.exe", "Extra.Spt", "hof.dat", "title.bmp"}));
+    for (const char *kept : {"Savedata/a.dat", "old.dat/inside.txt", "ZEP128/S-Camo/a.txt"})
+      EXPECT_TRUE(game.Exists(kept)) << kept;
+    EXPECT_TRUE(game.Exists("ZEP128/FoldersLoaded.txt"));
+    EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "");
+  }
+  EXPECT_EQ(caption.shown, (Names{"Please wait... cleaning up", "Selector",
+                                  "Please wait... cleaning up", "Selector"}));
+  EXPECT_TRUE(state.Ready);
+  EXPECT_EQ(state.Unigrid.rows[1].mark, "");
+  EXPECT_EQ(state.Unigrid.rows[1].nameColour, 0xFFFFFFu);
+  EXPECT_FALSE(state.Slots.frameVisible);
+  EXPECT_TRUE(failures.Empty());
+}
+
+TEST(ResetAll, FirstLineOfCleanUpIniReplacesTheDefaultUnlessBlank) {
+  TestFolder game;
+  MakeGame(game);
+  const AppState state = StateFor(game.Path());
+  Failures failures;
+  game.Write("ZEP128/cleanup.INI", "*.dat\r\n*.txt\r\n");
+  EXPECT_EQ(CleanUpNames(state, failures), (Names{"planes.dat"}));
+  for (const char *blank : {"", "  \t\r\n*.dat", "\r\n*.dat"}) {
+    game.Write("ZEP128/cleanup.INI", blank);
+    EXPECT_EQ(CleanUpNames(state, failures),
+              (Names{"mypic", "pic1.bmp", "planes.dat", "readme.txt"}));
+  }
+  EXPECT_TRUE(failures.Empty());
+}
+
+TEST(ResetAll, AFileThatCannotBeDeletedIsSkippedAndNamed) {
+  TestFolder game;
+  MakeGame(game);
+  const AppState state = StateFor(game.Path());
+  Failures failures;
+  const Names names = CleanUpNames(state, failures);
+  // Something took the file's place after the listing: a folder that is not empty stays put.
+  fs::remove(game.Path() / "pic1.bmp");
+  game.Write("pic1.bmp/keep.txt");
+  DeleteFiles(state.EAWDir, names, failures);
+  EXPECT_FALSE(game.Exists("mypic"));
+  EXPECT_FALSE(game.Exists("readme.txt"));
+  ASSERT_EQ(failures.Lines().size(), 1u);
+  EXPECT_NE(failures.Lines()[0].find("pic1.bmp"), std::string::npos);
+}

@@ -1,0 +1,172 @@
+#include "ui/main_window.h"
+
+#include "app/existence.h"
+#include "app/startup.h"
+#include "library/grid_click.h"
+#include "library/loaded_record.h"
+#include "library/record_replay.h"
+#include "ui/folder_grid_model.h"
+#include "ui/picture.h"
+#include "ui/qt_paths.h"
+#include "ui/slot_grid_view.h"
+#include "ui/twips.h"
+#include "ui/window_icon.h"
+
+#include <QGuiApplication>
+#include <QHeaderView>
+#include <QKeyEvent>
+#include <QMessageBox>
+#include <QMouseEvent>
+#include <QScreen>
+#include <QStyle>
+#include <QTimer>
+
+namespace fs = std::filesystem;
+
+MainWindow::MainWindow(const fs::path &eawDir)
+    : state_(StateFor(eawDir)), c_(BuildControls(this)), caption_(this),
+      gridModel_(new FolderGridModel(state_.Unigrid, this)) {
+  setObjectName("ZEPForm");
+  setWindowTitle(WindowCaptionText());
+  setWindowIcon(WindowIcon());
+  c_.Unigrid->setModel(gridModel_);
+  WireEvents();
+}
+
+MainWindow::~MainWindow() = default;
+
+void MainWindow::WireEvents() {
+  connect(c_.Command3, &QPushButton::clicked, this, &MainWindow::Command3_Click);
+  connect(c_.Command8, &QPushButton::clicked, this, &MainWindow::Command8_Click);
+  connect(c_.Unigrid, &QTableView::clicked, this, &MainWindow::Unigrid_Click);
+  c_.LoadFrame->installEventFilter(this);
+  c_.List3->viewport()->installEventFilter(this);
+  c_.Unigrid->installEventFilter(this);
+}
+
+void MainWindow::FormLoad() {
+  Failures failures;
+  c_.EAWDirLabel->setText(FromPath(state_.EAWDir));
+  state_.Ready = false;
+  const std::vector<SkippedLine> skipped = PrepareLibrary(state_, failures);
+  if (QScreen *screen = QGuiApplication::primaryScreen()) {
+    const QRect area = screen->geometry();
+    move(area.x() + (area.width() - width()) / 2, area.y() + (area.height() - height()) / 2);
+    const QSize pixels = area.size() * screen->devicePixelRatio();
+    c_.Label18[0]->setText(QString::number(pixels.width()));
+    c_.Label18[1]->setText(QString::number(pixels.height()));
+  }
+  c_.Label3->setText("Concept: by and for the players\r\n"
+                     "Programmed in C++ with Qt\r\n");
+  c_.List3->clear();
+  for (const std::string &entry : state_.List3)
+    c_.List3->addItem(FromName(entry));
+  c_.Label1->setText(FromPath(state_.EAWDir / ""));
+  BuildGrid(state_, failures);
+  ShowGridRows();
+  EnsureRecord(state_, failures);
+  ReplayRecord(state_, caption_, failures);
+  FileCheck(state_.EAWDir / "background");
+  state_.BackPic = FileFound ? state_.EAWDir / "background" : fs::path();
+  ShowPicture(c_.MyImage, state_.BackPic);
+  FileCheck(state_.EAWDir / "newpic");
+  ShowPicture(c_.Image3, FileFound ? state_.EAWDir / "newpic" : fs::path());
+  c_.SSTab1->setCurrentIndex(0);
+  c_.List3->setCurrentRow(0);
+  state_.Ready = true;
+  ShowGridChanges();
+  if (!skipped.empty())
+    failures.Add(SkippedLinesMessage(skipped));
+  QTimer::singleShot(0, this, [this, failures] { Tell(failures, "Start-up could not do all:"); });
+}
+
+void MainWindow::Command3_Click() { close(); }
+
+void MainWindow::Command8_Click() { showMinimized(); }
+
+void MainWindow::ClearPreview() {
+  c_.MyLabel->clear();
+  ShowPicture(c_.MyImage, state_.BackPic);
+}
+
+void MainWindow::Unigrid_Click(const QModelIndex &index) {
+  state_.Unigrid.currentRow = index.row() + 1;
+  Failures failures;
+  UnigridClick(state_, caption_, failures);
+  ShowGridChanges();
+  Tell(failures, "Some files could not be handled:");
+}
+
+void MainWindow::Unigrid_KeyPress(int key) {
+  const QModelIndex current = c_.Unigrid->currentIndex();
+  if (key == 13 && current.isValid())
+    Unigrid_Click(current);
+}
+
+bool MainWindow::eventFilter(QObject *watched, QEvent *event) {
+  const bool moved = event->type() == QEvent::MouseMove;
+  if (moved && (watched == c_.LoadFrame || watched == c_.List3->viewport())) {
+    ClearPreview();
+  } else if (watched == c_.Unigrid && event->type() == QEvent::KeyPress) {
+    auto *key = static_cast<QKeyEvent *>(event);
+    if (key->key() == Qt::Key_Return || key->key() == Qt::Key_Enter) {
+      Unigrid_KeyPress(13);
+      return true;
+    }
+    // Typed characters do nothing; arrow keys still move the current row.
+    return !key->text().isEmpty();
+  }
+  return QWidget::eventFilter(watched, event);
+}
+
+void MainWindow::ShowGridRows() {
+  gridModel_->Rebuilt();
+  QTableView *grid = c_.Unigrid;
+  grid->setColumnHidden(0, true);
+  grid->setColumnWidth(1, TwipsToPixels(5000));
+  grid->horizontalHeader()->setStretchLastSection(true);
+  // The name column is wider than the grid, so the horizontal scroll bar is always there; its
+  // height is added so that it covers no row.
+  const int scrollBar = grid->style()->pixelMetric(QStyle::PM_ScrollBarExtent);
+  const QRect place = grid->geometry();
+  grid->setGeometry(place.x(), place.y(), place.width(),
+                    TwipsToPixels(GridHeightTwips(state_.Unigrid.RowCount())) + scrollBar);
+}
+
+void MainWindow::ShowGridChanges() {
+  QTableView *grid = c_.Unigrid;
+  grid->setUpdatesEnabled(false);
+  for (int row = 1; row < state_.Unigrid.RowCount(); ++row) {
+    const bool hidden = state_.Unigrid.rows[static_cast<size_t>(row)].height == 0;
+    if (grid->isRowHidden(row - 1) != hidden)
+      grid->setRowHidden(row - 1, hidden);
+  }
+  gridModel_->Changed();
+  const int current = state_.Unigrid.currentRow;
+  if (current >= 1)
+    grid->setCurrentIndex(gridModel_->index(current - 1, state_.Unigrid.currentCol));
+  grid->setUpdatesEnabled(true);
+  ShowSlotPanel();
+}
+
+void MainWindow::ShowSlotPanel() {
+  const SlotPanel &panel = state_.Slots;
+  c_.SlotFrame->setVisible(panel.frameVisible);
+  c_.SlotLabel->setText(FromName(panel.label));
+  c_.SlotGrid->setVisible(panel.gridVisible);
+  FillSlotGrid(c_.SlotGrid, panel, c_.SlotFrame->palette().color(QPalette::Window));
+}
+
+void MainWindow::ShowPicture(QLabel *label, const fs::path &picture) {
+  label->setPixmap(picture.empty() ? QPixmap() : LoadPicture(picture, label->size()));
+}
+
+void MainWindow::Tell(const Failures &failures, const QString &heading) {
+  if (failures.Empty())
+    return;
+  auto *box =
+      new QMessageBox(QMessageBox::Warning, WindowCaptionText().simplified(),
+                      FromName(failures.Message(heading.toStdString())), QMessageBox::Ok, this);
+  box->setAttribute(Qt::WA_DeleteOnClose);
+  box->open();
+}

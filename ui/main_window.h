@@ -1,0 +1,46 @@
+#pragma once
+
+#include "app/app_state.h"
+#include "app/failures.h"
+#include "ui/window_caption.h"
+#include "ui/window_layout.h"
+
+#include <QPixmap>
+#include <QWidget>
+#include <filesystem>
+
+class FolderGridModel;
+
+// The program's one window: builds its controls, forwards their events to the logic and shows
+// the logic's state.
+class MainWindow : public QWidget {
+  Q_OBJECT
+public:
+  explicit MainWindow(const std::filesystem::path &eawDir);
+  ~MainWindow() override;
+
+  // The start-up sequence, run once before the window is first shown.
+  void FormLoad();
+  const AppState &State() const { return state_; }
+
+protected:
+  bool eventFilter(QObject *watched, QEvent *event) override;
+
+private:
+  void WireEvents();
+  void Command3_Click();
+  void Command8_Click();
+  void ClearPreview();
+  void Unigrid_Click(const QModelIndex &index);
+  void Unigrid_KeyPress(int key);
+  void ShowGridRows();
+  void ShowGridChanges();
+  void ShowSlotPanel();
+  void ShowPicture(QLabel *label, const std::filesystem::path &picture);
+  void Tell(const Failures &failures, const QString &heading);
+
+  AppState state_;
+  Controls c_;
+  WindowCaption caption_;
+  FolderGridModel *gridModel_;
+};

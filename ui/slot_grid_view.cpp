@@ -1,0 +1,37 @@
+#include "ui/slot_grid_view.h"
+
+#include "ui/qt_paths.h"
+#include "ui/twips.h"
+
+namespace {
+
+const char *const kHeaders[] = {"Folder", "PlnSlot", "SkinSlot", "Aircraft", ""};
+const int kWidthsTwips[] = {2000, 0, 0, 2000, 0};
+
+void SetCell(QTableWidget *grid, int row, int column, const QString &text) {
+  grid->setItem(row, column, new QTableWidgetItem(text));
+}
+
+} // namespace
+
+void FillSlotGrid(QTableWidget *grid, const SlotPanel &panel, const QColor &headerColour) {
+  const int columns = 5;
+  grid->clear();
+  grid->setColumnCount(columns);
+  grid->setRowCount(1 + static_cast<int>(panel.rows.size()));
+  for (int column = 0; column < columns; ++column) {
+    SetCell(grid, 0, column, kHeaders[column]);
+    grid->item(0, column)->setBackground(headerColour);
+    grid->setColumnHidden(column, kWidthsTwips[column] == 0);
+    if (kWidthsTwips[column] > 0)
+      grid->setColumnWidth(column, TwipsToPixels(kWidthsTwips[column]));
+  }
+  int row = 1;
+  for (const SlotRow &slot : panel.rows) {
+    SetCell(grid, row, 0, FromName(slot.folder));
+    SetCell(grid, row, 1, FromName(slot.plnSlot));
+    SetCell(grid, row, 2, FromName(slot.skinSlot));
+    SetCell(grid, row, 3, FromName(slot.aircraft));
+    ++row;
+  }
+}

@@ -1,0 +1,17 @@
+#include "ui/twips.h"
+
+#include <cmath>
+
+int TwipsToPixels(int twips) {
+  return static_cast<int>(std::lround(static_cast<double>(twips) / kTwipsPerPixel));
+}
+
+QRect Twips(int left, int top, int width, int height) {
+  return QRect(TwipsToPixels(left), TwipsToPixels(top), TwipsToPixels(width),
+               TwipsToPixels(height));
+}
+
+QColor FromOle(std::uint32_t ole) {
+  return QColor(static_cast<int>(ole & 0xFF), static_cast<int>((ole >> 8) & 0xFF),
+                static_cast<int>((ole >> 16) & 0xFF));
+}

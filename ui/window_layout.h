@@ -1,0 +1,46 @@
+#pragma once
+
+#include <QFrame>
+#include <QGroupBox>
+#include <QLabel>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QPlainTextEdit>
+#include <QPushButton>
+#include <QTabWidget>
+#include <QTableView>
+#include <QTableWidget>
+
+// Every control of the main window, named as the window's logic knows them.
+struct Controls {
+  QPushButton *delmsn, *Command1, *Command8, *Command3;
+  QLabel *Label1;
+  QTabWidget *SSTab1;
+  // "General Settings" page
+  QLabel *Image3, *Label3, *EAWDirLabel;
+  QGroupBox *Frame2;
+  QLabel *Label5, *Label32;
+  QLabel *Label18[2];
+  QLineEdit *Text5, *Text6, *Text4, *Text7, *Text88, *Text11;
+  QPushButton *IniEdit;
+  QGroupBox *Frame21;
+  QPushButton *InSaver;
+  QPlainTextEdit *Text14;
+  // "World settings" page
+  QFrame *LoadFrame;
+  QLabel *Label22, *Label9, *Label6, *Label33, *Label15, *Label11;
+  QListWidget *List3, *List4;
+  QTableView *Unigrid;
+  QLabel *MyImage, *MyLabel;
+  QPlainTextEdit *Text9;
+  QFrame *SlotFrame;
+  QLabel *SlotLabel;
+  QTableWidget *SlotGrid;
+};
+
+// The window's font at `points` size: the Windows dialog font or a look-alike.
+QFont WindowFont(double points);
+// The window's exact caption, 108 characters.
+QString WindowCaptionText();
+// Creates every control on `window` with its name, text, tool tip, colours, font and place.
+Controls BuildControls(QWidget *window);
