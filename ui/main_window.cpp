@@ -2,9 +2,13 @@
 
 #include "app/existence.h"
 #include "app/startup.h"
+#include "library/category_view.h"
 #include "library/grid_click.h"
 #include "library/loaded_record.h"
+#include "library/preview.h"
 #include "library/record_replay.h"
+#include "library/refresh.h"
+#include "library/reset_all.h"
 #include "ui/folder_grid_model.h"
 #include "ui/picture.h"
 #include "ui/qt_paths.h"
@@ -38,10 +42,15 @@ MainWindow::~MainWindow() = default;
 void MainWindow::WireEvents() {
   connect(c_.Command3, &QPushButton::clicked, this, &MainWindow::Command3_Click);
   connect(c_.Command8, &QPushButton::clicked, this, &MainWindow::Command8_Click);
+  connect(c_.Command1, &QPushButton::clicked, this, &MainWindow::Command1_Click);
   connect(c_.Unigrid, &QTableView::clicked, this, &MainWindow::Unigrid_Click);
+  connect(c_.List3, &QListWidget::currentRowChanged, this, &MainWindow::List3_Click);
   c_.LoadFrame->installEventFilter(this);
   c_.List3->viewport()->installEventFilter(this);
   c_.Unigrid->installEventFilter(this);
+  c_.Unigrid->viewport()->installEventFilter(this);
+  c_.Unigrid->horizontalHeader()->installEventFilter(this);
+  c_.Label33->installEventFilter(this);
 }
 
 void MainWindow::FormLoad() {
@@ -73,6 +82,7 @@ void MainWindow::FormLoad() {
   ShowPicture(c_.Image3, FileFound ? state_.EAWDir / "newpic" : fs::path());
   c_.SSTab1->setCurrentIndex(0);
   c_.List3->setCurrentRow(0);
+  List3_Click(0);
   state_.Ready = true;
   ShowGridChanges();
   if (!skipped.empty())
@@ -87,6 +97,44 @@ void MainWindow::Command8_Click() { showMinimized(); }
 void MainWindow::ClearPreview() {
   c_.MyLabel->clear();
   ShowPicture(c_.MyImage, state_.BackPic);
+}
+
+void MainWindow::List3_Click(int k) {
+  c_.Label6->setText(FromName(List3Click(state_, k)));
+  c_.Label6->repaint();
+  ShowGridChanges();
+}
+
+void MainWindow::Label33_Click() {
+  Failures failures;
+  Label33Click(state_, caption_, failures);
+  ShowGridRows();
+  ShowGridChanges();
+  Tell(failures, "Refresh could not do all:");
+}
+
+void MainWindow::Command1_Click() {
+  Failures failures;
+  Command1Click(state_, caption_, failures);
+  ShowGridChanges();
+  Tell(failures, "Reset All could not delete these files:");
+}
+
+void MainWindow::Unigrid_MouseMove(int row) {
+  if (!EnterHoverRow(state_, row))
+    return;
+  c_.MyLabel->clear();
+  c_.Text9->clear();
+  ShowPicture(c_.MyImage, state_.BackPic);
+  const FolderPreview preview = PreviewOfRow(state_, row);
+  const QString description = FromText(preview.description);
+  c_.MyLabel->setText(description);
+  c_.Text9->setPlainText(description);
+  if (!preview.picture.empty()) {
+    const QPixmap picture = LoadPicture(preview.picture, c_.MyImage->size());
+    if (!picture.isNull())
+      c_.MyImage->setPixmap(picture);
+  }
 }
 
 void MainWindow::Unigrid_Click(const QModelIndex &index) {
@@ -107,6 +155,14 @@ bool MainWindow::eventFilter(QObject *watched, QEvent *event) {
   const bool moved = event->type() == QEvent::MouseMove;
   if (moved && (watched == c_.LoadFrame || watched == c_.List3->viewport())) {
     ClearPreview();
+  } else if (moved && watched == c_.Unigrid->viewport()) {
+    const int row = c_.Unigrid->rowAt(static_cast<QMouseEvent *>(event)->position().toPoint().y());
+    if (row >= 0)
+      Unigrid_MouseMove(row + 1);
+  } else if (moved && watched == c_.Unigrid->horizontalHeader()) {
+    Unigrid_MouseMove(0);
+  } else if (watched == c_.Label33 && event->type() == QEvent::MouseButtonRelease) {
+    Label33_Click();
   } else if (watched == c_.Unigrid && event->type() == QEvent::KeyPress) {
     auto *key = static_cast<QKeyEvent *>(event);
     if (key->key() == Qt::Key_Return || key->key() == Qt::Key_Enter) {

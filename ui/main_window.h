@@ -31,6 +31,10 @@ private:
   void Command3_Click();
   void Command8_Click();
   void ClearPreview();
+  void List3_Click(int k);
+  void Label33_Click();
+  void Command1_Click();
+  void Unigrid_MouseMove(int row);
   void Unigrid_Click(const QModelIndex &index);
   void Unigrid_KeyPress(int key);
   void ShowGridRows();

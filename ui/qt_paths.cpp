@@ -1,6 +1,7 @@
 #include "ui/qt_paths.h"
 
 #include <QFile>
+#include <QStringDecoder>
 
 namespace fs = std::filesystem;
 
@@ -15,3 +16,10 @@ QString FromPath(const fs::path &path) { return QFile::decodeName(path.string().
 QString FromName(const std::string &name) { return QFile::decodeName(name.c_str()); }
 std::string ToName(const QString &text) { return QFile::encodeName(text).toStdString(); }
 #endif
+
+QString FromText(const std::string &bytes) {
+  QStringDecoder utf8(QStringDecoder::Utf8);
+  const QString text = utf8(QByteArrayView(bytes.data(), static_cast<qsizetype>(bytes.size())));
+  return utf8.hasError() ? QString::fromLatin1(bytes.data(), static_cast<qsizetype>(bytes.size()))
+                         : text;
+}

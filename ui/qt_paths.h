@@ -10,5 +10,7 @@ std::filesystem::path ToPath(const QString &text);
 QString FromPath(const std::filesystem::path &path);
 // A name kept by the logic (see NameText) for display in a widget.
 QString FromName(const std::string &name);
+// The bytes of a text file for display: UTF-8 when they are valid UTF-8, else Latin-1.
+QString FromText(const std::string &bytes);
 // Text typed into a widget as the logic keeps names and captions.
 std::string ToName(const QString &text);

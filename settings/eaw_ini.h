@@ -1,0 +1,36 @@
+#pragma once
+
+#include "app/failures.h"
+
+#include <array>
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+// The six settings keys, in the order in which they are read and written: the boxes Width,
+// Height, Extra Squads, Day, Month and Planeset.
+inline constexpr std::array<std::string_view, 6> kIniKeys = {
+    "Width=", "Height=", "ExtraSquads=", "Day=", "Month=", "PlaneSetNumber="};
+
+// One text per key of kIniKeys, as the boxes hold them.
+using IniTexts = std::array<std::string, kIniKeys.size()>;
+// One display text per key of kIniKeys; nothing where the key was not found.
+using IniValues = std::array<std::optional<std::string>, kIniKeys.size()>;
+
+// The game's settings file "eaw.ini" in `eawDir`, found whatever its letter case.
+std::filesystem::path IniPath(const std::filesystem::path &eawDir);
+// The values of the six keys as the boxes show them, each from the key's last line. A missing
+// or unreadable file gives nothing for every key, so that the boxes keep what they show.
+IniValues IniRead(const std::filesystem::path &eawDir, Failures &failures);
+// The file's lines with every line that begins with a key replaced by the key and its box text,
+// each line ended by CR LF.
+std::string RewrittenIni(const std::vector<std::string> &lines, const IniTexts &texts);
+// Writes the six box texts into eaw.ini (Enter in a settings box). Does nothing while `ready` is
+// false or when the file is missing; a read-only file is written and left writable.
+void inisave(const std::filesystem::path &eawDir, bool ready, const IniTexts &texts,
+             Failures &failures);
+// Replaces the settings file at `path` by `bytes` atomically, keeping its permissions and making
+// it writable. On failure the file is left as it was and false is returned, with the reason.
+bool ReplaceIni(const std::filesystem::path &path, const std::string &bytes, Failures &failures);

@@ -1,0 +1,22 @@
+#pragma once
+
+#include "app/failures.h"
+
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+// What the music part of the window shows.
+struct MusicList {
+  std::vector<std::string> entries;   // the inactive sets, in Music.ini order
+  std::optional<std::string> current; // the active set; nothing keeps what the window shows
+};
+
+// Whether a Music.ini line can name a set: a plain folder name of the game folder, not blank,
+// not "." or "..", without "\", "/" or ":".
+bool IsMusicSetName(std::string_view line);
+// The music sets of Music.ini (found whatever its letter case): a name whose folder exists is an
+// entry; the last name without a folder is the current set. A missing file gives nothing.
+MusicList FillMusicList(const std::filesystem::path &eawDir, Failures &failures);

@@ -1,0 +1,86 @@
+#include "settings/eaw_ini.h"
+#include "settings/ini_editor.h"
+#include "tests/test_folder.h"
+
+#include <gtest/gtest.h>
+
+namespace {
+
+const std::string kIni = "[Screen]\r\nWidth=0800\r\nHeight=600 ; small\r\n Width=5\r\nwidth=6\r\n"
+                         "[Game]\r\nDay=abc\r\nWidth=1024\r\nMonth=\r\nPlaneSetNumber=&H10";
+const IniTexts kTexts = {"1280", "", "3", "12", "abc", "2"};
+
+using Shown = std::vector<std::optional<std::string>>;
+Shown Read(const TestFolder &game) {
+  Failures failures;
+  const IniValues values = IniRead(game.Path(), failures);
+  return Shown(values.begin(), values.end());
+}
+
+} // namespace
+
+TEST(EawIni, ReadsAndRewritesOnlyLinesThatBeginWithAKey) {
+  TestFolder game;
+  EXPECT_EQ(Read(game), Shown(6));
+  game.Write("EAW.INI", kIni);
+  EXPECT_EQ(Read(game), (Shown{"1024", "600", std::nullopt, "0", "0", "16"}));
+  Failures failures;
+  inisave(game.Path(), false, kTexts, failures);
+  EXPECT_EQ(game.Read("EAW.INI"), kIni);
+  inisave(game.Path(), true, kTexts, failures);
+  EXPECT_EQ(game.Read("EAW.INI"),
+            "[Screen]\r\nWidth=1280\r\nHeight=\r\n Width=5\r\nwidth=6\r\n"
+            "[Game]\r\nDay=12\r\nWidth=1280\r\nMonth=abc\r\nPlaneSetNumber=2\r\n");
+  EXPECT_EQ(Read(game), (Shown{"1280", "0", std::nullopt, "12", "0", "2"}));
+  EXPECT_TRUE(failures.Empty());
+  EXPECT_EQ(std::distance(std::filesystem::directory_iterator(game.Path()), {}), 1);
+}
+
+TEST(EawIni, ReadsAndWritesLinesEndedByLineFeedsAlone) {
+  TestFolder game;
+  game.Write("eaw.ini", "Width=640\nHeight=480\nSound=1\n");
+  EXPECT_EQ(Read(game)[1], "480");
+  Failures failures;
+  inisave(game.Path(), true, kTexts, failures);
+  EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\nHeight=\r\nSound=1\r\n");
+}
+
+TEST(EawIni, WritesAReadOnlyFileButNeverDamagesIt) {
+  TestFolder game;
+  Failures failures;
+  inisave(game.Path(), true, kTexts, failures);
+  EXPECT_FALSE(game.Exists("eaw.ini"));
+  SetReadOnly(game.Write("eaw.ini", "Width=1\r\n"), true);
+  inisave(game.Path(), true, kTexts, failures);
+  EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\n");
+  EXPECT_TRUE(IsWritable(game.Path() / "eaw.ini"));
+  EXPECT_TRUE(failures.Empty());
+
+  game.Write("eaw.ini.partial/in the way");
+  inisave(game.Path(), true, {"640"}, failures);
+  EXPECT_FALSE(IniEditorSave(game.Path(), "Width=2", failures));
+  EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\n");
+  ASSERT_FALSE(failures.Empty());
+  EXPECT_NE(failures.Lines()[0].find("eaw.ini"), std::string::npos);
+}
+
+TEST(IniEditor, ShowsTheFileAndSavesTheTextWithOneMoreLine) {
+  TestFolder game;
+  Failures failures;
+  EXPECT_EQ(IniDisplayText(game.Path(), failures), "");
+  EXPECT_FALSE(IniEditorSave(game.Path(), "Width=1", failures));
+  EXPECT_FALSE(game.Exists("eaw.ini"));
+  game.Write("Eaw.ini", "a\r\nb\nc");
+  const std::string shown = IniDisplayText(game.Path(), failures);
+  EXPECT_EQ(shown, "a\r\nb\r\nc\r\n");
+  EXPECT_TRUE(IniEditorSave(game.Path(), shown, failures));
+  EXPECT_EQ(game.Read("Eaw.ini"), "a\r\nb\r\nc\r\n\r\n");
+  EXPECT_TRUE(IniEditorSave(game.Path(), "x\ny", failures));
+  EXPECT_EQ(game.Read("Eaw.ini"), "x\r\ny\r\n");
+  EXPECT_TRUE(failures.Empty());
+
+  SetReadOnly(game.Path() / "Eaw.ini", true);
+  EXPECT_FALSE(IniEditorSave(game.Path(), "Width=2", failures));
+  EXPECT_EQ(game.Read("Eaw.ini"), "x\r\ny\r\n");
+  EXPECT_EQ(failures.Lines().size(), 1u);
+}

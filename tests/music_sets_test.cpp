@@ -1,0 +1,66 @@
+#include "settings/music_sets.h"
+#include "settings/music_switch.h"
+#include "tests/test_folder.h"
+
+#include <gtest/gtest.h>
+
+namespace {
+
+using Names = std::vector<std::string>;
+
+// Set1 and Set2 have folders of their own; Set3 is the game's "Music".
+void MakeThreeSets(const TestFolder &game) {
+  game.Write("MUSIC.INI", "Set1\r\nSet2\r\nSet3\r\n");
+  game.Write("Set1/a.bgm", "1");
+  game.Write("Set2/a.bgm", "2");
+  game.Write("Music/a.bgm", "3");
+}
+
+void ExpectUntouched(const TestFolder &game) {
+  EXPECT_EQ(game.Read("Set1/a.bgm") + game.Read("Set2/a.bgm") + game.Read("Music/a.bgm"), "123");
+  EXPECT_FALSE(game.Exists("Set3"));
+}
+
+} // namespace
+
+TEST(MusicSets, ListsSetsWithFoldersAndShowsTheLastOneWithoutAsCurrent) {
+  TestFolder game;
+  Failures failures;
+  EXPECT_TRUE(FillMusicList(game.Path(), failures).entries.empty());
+  MakeThreeSets(game);
+  EXPECT_EQ(FillMusicList(game.Path(), failures).entries, (Names{"Set1", "Set2"}));
+  game.Write("Music.ini", "Set1\n..\n.\n \n\nC:x\na/b\na\\b\nGone\nSet2\nSet3\nset1");
+  MusicList list = FillMusicList(game.Path(), failures);
+  EXPECT_EQ(list.entries, (Names{"Set1", "Set2", "set1"}));
+  EXPECT_EQ(list.current, "Set3");
+  game.MakeFolder("Set3");
+  EXPECT_EQ(FillMusicList(game.Path(), failures).current, "Gone");
+  EXPECT_TRUE(failures.Empty());
+}
+
+TEST(MusicSets, SwitchesThereAndBackRestoringEveryFolder) {
+  TestFolder game;
+  MakeThreeSets(game);
+  Failures failures;
+  ASSERT_TRUE(SwitchMusic(game.Path(), "Set3", "Set1", failures));
+  EXPECT_EQ(game.Read("Music/a.bgm") + game.Read("Set3/a.bgm"), "13");
+  const MusicList list = FillMusicList(game.Path(), failures);
+  EXPECT_EQ(list.entries, (Names{"Set2", "Set3"}));
+  EXPECT_EQ(list.current, "Set1");
+  ASSERT_TRUE(SwitchMusic(game.Path(), "Set1", "Set3", failures));
+  ExpectUntouched(game);
+  EXPECT_TRUE(failures.Empty());
+}
+
+TEST(MusicSets, AFailedSwitchChangesNoFolderAndSaysSo) {
+  TestFolder game;
+  MakeThreeSets(game);
+  game.Write("NotAFolder", "file");
+  Failures failures;
+  EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "NotAFolder", failures)); // second rename fails
+  EXPECT_FALSE(SwitchMusic(game.Path(), "", "Set1", failures));
+  EXPECT_FALSE(SwitchMusic(game.Path(), "Set2", "Set1", failures)); // Set2 is taken
+  EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "..", failures));
+  EXPECT_EQ(failures.Lines().size(), 4u);
+  ExpectUntouched(game);
+}
