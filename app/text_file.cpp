@@ -67,21 +67,27 @@ static bool WriteWhole(const fs::path &path, const std::string &bytes) {
   return !out.fail();
 }
 
+// Removes what a failed write left, but never a folder that merely had the temporary name.
+static void RemoveTemporary(const fs::path &temporary) {
+  std::error_code error;
+  if (fs::is_regular_file(temporary, error))
+    fs::remove(temporary, error);
+}
+
 bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures &failures) {
   fs::path temporary = target;
   temporary += ".partial";
   errno = 0;
   if (!WriteWhole(temporary, bytes)) {
     failures.Add(target, "cannot be written (" + LastErrorText() + ")");
-    std::error_code ignored;
-    fs::remove(temporary, ignored);
+    RemoveTemporary(temporary);
     return false;
   }
   std::error_code error;
   fs::rename(temporary, target, error);
   if (error) {
     failures.Add(target, "cannot be replaced (" + error.message() + ")");
-    fs::remove(temporary, error);
+    RemoveTemporary(temporary);
     return false;
   }
   return true;

@@ -9,6 +9,11 @@
 #include "library/record_replay.h"
 #include "library/refresh.h"
 #include "library/reset_all.h"
+#include "settings/eaw_ini.h"
+#include "settings/game_start_qt.h"
+#include "settings/ini_editor.h"
+#include "settings/music_sets.h"
+#include "settings/music_switch.h"
 #include "ui/folder_grid_model.h"
 #include "ui/picture.h"
 #include "ui/qt_paths.h"
@@ -45,6 +50,13 @@ void MainWindow::WireEvents() {
   connect(c_.Command1, &QPushButton::clicked, this, &MainWindow::Command1_Click);
   connect(c_.Unigrid, &QTableView::clicked, this, &MainWindow::Unigrid_Click);
   connect(c_.List3, &QListWidget::currentRowChanged, this, &MainWindow::List3_Click);
+  connect(c_.IniEdit, &QPushButton::clicked, this, &MainWindow::IniEdit_Click);
+  connect(c_.InSaver, &QPushButton::clicked, this, &MainWindow::InSaver_Click);
+  connect(c_.List4, &QListWidget::itemClicked, this, &MainWindow::List4_Click);
+  connect(c_.delmsn, &QPushButton::clicked, this, &MainWindow::delmsn_Click);
+  for (QLineEdit *box : SettingsBoxes())
+    connect(box, &QLineEdit::returnPressed, this, &MainWindow::inisave);
+  c_.Frame21->installEventFilter(this);
   c_.LoadFrame->installEventFilter(this);
   c_.List3->viewport()->installEventFilter(this);
   c_.Unigrid->installEventFilter(this);
@@ -71,6 +83,7 @@ void MainWindow::FormLoad() {
   for (const std::string &entry : state_.List3)
     c_.List3->addItem(FromName(entry));
   c_.Label1->setText(FromPath(state_.EAWDir / ""));
+  IniRead();
   BuildGrid(state_, failures);
   ShowGridRows();
   EnsureRecord(state_, failures);
@@ -84,7 +97,11 @@ void MainWindow::FormLoad() {
   c_.List3->setCurrentRow(0);
   List3_Click(0);
   state_.Ready = true;
+  c_.SSTab1->setEnabled(true);
   ShowGridChanges();
+  FileCheck(state_.EAWDir / "Music.ini");
+  if (FileFound)
+    FillMusicList();
   if (!skipped.empty())
     failures.Add(SkippedLinesMessage(skipped));
   QTimer::singleShot(0, this, [this, failures] { Tell(failures, "Start-up could not do all:"); });
@@ -137,6 +154,74 @@ void MainWindow::Unigrid_MouseMove(int row) {
   }
 }
 
+std::array<QLineEdit *, 6> MainWindow::SettingsBoxes() const {
+  return {c_.Text5, c_.Text6, c_.Text4, c_.Text7, c_.Text88, c_.Text11};
+}
+
+void MainWindow::IniRead() {
+  Failures failures;
+  const IniValues values = ::IniRead(state_.EAWDir, failures);
+  const bool wasReady = state_.Ready;
+  state_.Ready = false;
+  const std::array<QLineEdit *, 6> boxes = SettingsBoxes();
+  for (size_t key = 0; key < boxes.size(); ++key)
+    if (values[key])
+      boxes[key]->setText(FromName(*values[key]));
+  state_.Ready = wasReady;
+  Tell(failures, "The settings could not be read:");
+}
+
+void MainWindow::inisave() {
+  IniTexts texts;
+  const std::array<QLineEdit *, 6> boxes = SettingsBoxes();
+  for (size_t key = 0; key < boxes.size(); ++key)
+    texts[key] = ToName(boxes[key]->text());
+  Failures failures;
+  ::inisave(state_.EAWDir, state_.Ready, texts, failures);
+  Tell(failures, "The settings could not be saved:");
+}
+
+void MainWindow::IniEdit_Click() {
+  c_.Frame21->show();
+  Failures failures;
+  c_.Text14->setPlainText(FromText(IniDisplayText(state_.EAWDir, failures), &editorLatin1_));
+  Tell(failures, "The settings file could not be shown:");
+}
+
+void MainWindow::InSaver_Click() {
+  Failures failures;
+  if (IniEditorSave(state_.EAWDir, ToText(c_.Text14->toPlainText(), editorLatin1_), failures))
+    IniRead();
+  Tell(failures, "The settings file could not be saved:");
+}
+
+void MainWindow::FillMusicList() {
+  Failures failures;
+  const MusicList music = ::FillMusicList(state_.EAWDir, failures);
+  c_.List4->clear();
+  for (const std::string &name : music.entries)
+    c_.List4->addItem(FromName(name));
+  if (music.current)
+    c_.Label11->setText(FromName(*music.current));
+  Tell(failures, "The music sets could not be read:");
+}
+
+void MainWindow::List4_Click(QListWidgetItem *item) {
+  Failures failures;
+  SwitchMusic(state_.EAWDir, ToName(c_.Label11->text()), ToName(item->text()), failures);
+  FillMusicList();
+  Tell(failures, "The music could not be switched:");
+}
+
+void MainWindow::delmsn_Click() {
+  const std::string problem = StartGame(state_.EAWDir);
+  if (!problem.empty()) {
+    Failures failures;
+    failures.Add(problem);
+    Tell(failures, "The game could not be started:");
+  }
+}
+
 void MainWindow::Unigrid_Click(const QModelIndex &index) {
   state_.Unigrid.currentRow = index.row() + 1;
   Failures failures;
@@ -161,6 +246,9 @@ bool MainWindow::eventFilter(QObject *watched, QEvent *event) {
       Unigrid_MouseMove(row + 1);
   } else if (moved && watched == c_.Unigrid->horizontalHeader()) {
     Unigrid_MouseMove(0);
+  } else if (watched == c_.Frame21 && (event->type() == QEvent::MouseButtonRelease ||
+                                       event->type() == QEvent::MouseButtonDblClick)) {
+    c_.Frame21->hide();
   } else if (watched == c_.Label33 && event->type() == QEvent::MouseButtonRelease) {
     Label33_Click();
   } else if (watched == c_.Unigrid && event->type() == QEvent::KeyPress) {

@@ -7,6 +7,7 @@
 
 #include <QPixmap>
 #include <QWidget>
+#include <array>
 #include <filesystem>
 
 class FolderGridModel;
@@ -28,6 +29,7 @@ protected:
 
 private:
   void WireEvents();
+  std::array<QLineEdit *, 6> SettingsBoxes() const;
   void Command3_Click();
   void Command8_Click();
   void ClearPreview();
@@ -35,6 +37,13 @@ private:
   void Label33_Click();
   void Command1_Click();
   void Unigrid_MouseMove(int row);
+  void IniRead();
+  void inisave();
+  void IniEdit_Click();
+  void InSaver_Click();
+  void FillMusicList();
+  void List4_Click(QListWidgetItem *item);
+  void delmsn_Click();
   void Unigrid_Click(const QModelIndex &index);
   void Unigrid_KeyPress(int key);
   void ShowGridRows();
@@ -47,4 +56,5 @@ private:
   Controls c_;
   WindowCaption caption_;
   FolderGridModel *gridModel_;
+  bool editorLatin1_ = false; // the eaw.ini editor's text came from Latin-1 bytes
 };

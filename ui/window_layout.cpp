@@ -245,6 +245,7 @@ Controls BuildControls(QWidget *window) {
   loader->setObjectName("WorldPage");
   c.SSTab1->addTab(general, "General Settings");
   c.SSTab1->addTab(loader, "World settings");
+  c.SSTab1->setEnabled(false);
   const QPoint origin = PageOrigin(c.SSTab1);
   BuildGeneralPage(general, origin, c);
   BuildLoaderPage(loader, origin, c);
