@@ -189,12 +189,13 @@ void BuildLoaderPage(QWidget *page, QPoint origin, Controls &c) {
   c.Label33 = MakeLabel(f, "Label33", "Refresh!", Twips(1590, 810, 1125, 375));
   Paint(c.Label33, QColor("#0000FF"));
   SetFont(c.Label33, 9.75);
+  c.Label33->setAlignment(Qt::AlignCenter);
   c.Label33->setCursor(Qt::PointingHandCursor);
   c.List3 = Make<QListWidget>(f, "List3", Twips(30, 1230, 3675, 7080));
   Paint(c.List3, QColor("#FFC0C0"));
   c.List3->setMouseTracking(true);
   BuildFolderGrid(f, c);
-  c.Label15 = MakeLabel(f, "Label15", "Current Music", Twips(4140, 6540, 555, 375));
+  c.Label15 = MakeWrappedLabel(f, "Label15", "Current Music", Twips(4140, 6540, 555, 375));
   SetTextColour(c.Label15, QColor("#000080"));
   c.Label11 = MakeLabel(f, "Label11", "", Twips(4800, 6600, 2445, 345));
   SetTextColour(c.Label11, QColor("#000080"));

@@ -10,5 +10,5 @@ void WrappingButton::paintEvent(QPaintEvent *) {
   initStyleOption(&option);
   option.text.clear();
   painter.drawControl(QStyle::CE_PushButton, option);
-  painter.drawText(rect().adjusted(4, 2, -4, -2), Qt::AlignCenter | Qt::TextWordWrap, text());
+  painter.drawText(rect().adjusted(3, 0, -3, 0), Qt::AlignCenter | Qt::TextWordWrap, text());
 }
