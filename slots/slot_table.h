@@ -4,6 +4,9 @@
 #include <string>
 #include <vector>
 
+// Columns of the slot grid: Folder, PlnSlot, SkinSlot, Aircraft and one empty column.
+inline constexpr int kSlotColumns = 5;
+
 // One plane-set folder in the slot grid.
 struct SlotRow {
   std::string folder;
@@ -17,7 +20,7 @@ struct SlotPanel {
   bool frameVisible = false;
   bool gridVisible = false;
   std::string label;
-  int columns = 5;
+  int columns = kSlotColumns;
   std::vector<SlotRow> rows;           // data rows; the header row is the window's
   std::uint32_t currentCellColour = 0; // the slot grid's default cell colour
 };

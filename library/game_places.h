@@ -1,0 +1,40 @@
+#pragma once
+
+#include "app/failures.h"
+#include "library/file_rules.h"
+#include "library/name_index.h"
+
+#include <array>
+#include <filesystem>
+#include <optional>
+#include <utility>
+
+// The folder of `place` in the game folder: the game folder itself, or its "Savedata" or
+// "Music" subfolder found whatever its letter case (the usual spelling when there is none).
+std::filesystem::path PlaceFolder(const std::filesystem::path &eawDir, Place place);
+// Creates the place folder `folder` when it is missing; false, with the reason in `failures`, when
+// it neither exists nor can be created.
+bool EnsurePlaceFolder(const std::filesystem::path &folder, Failures &failures);
+
+// The game's three places during one load or unload: each found and listed at most once.
+class GamePlaces {
+public:
+  explicit GamePlaces(std::filesystem::path eawDir) : eawDir_(std::move(eawDir)) {}
+  // The place's folder, found on first use.
+  const std::filesystem::path &Folder(Place place);
+  // The place's files, listed on first use.
+  NameIndex &Index(Place place);
+  // Creates the place's folder when missing; false, with the reason, when that fails.
+  bool Ensure(Place place, Failures &failures);
+
+private:
+  struct Entry {
+    std::optional<std::filesystem::path> folder;
+    std::optional<NameIndex> index;
+    std::optional<bool> usable;
+  };
+  Entry &At(Place place) { return entries_[static_cast<size_t>(place)]; }
+
+  std::filesystem::path eawDir_;
+  std::array<Entry, 3> entries_;
+};

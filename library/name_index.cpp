@@ -1,0 +1,38 @@
+#include "library/name_index.h"
+
+#include "app/names.h"
+#include "library/listing.h"
+
+#include <algorithm>
+
+NameIndex::NameIndex(const std::filesystem::path &folder) {
+  for (std::string &name : ListFiles(folder))
+    byUpper_[Upper(name)].push_back(std::move(name));
+}
+
+const std::vector<std::string> &NameIndex::Matches(std::string_view name) const {
+  static const std::vector<std::string> none;
+  const auto found = byUpper_.find(Upper(name));
+  return found == byUpper_.end() ? none : found->second;
+}
+
+std::string NameIndex::TargetName(const std::string &name) const {
+  const std::vector<std::string> &matches = Matches(name);
+  if (matches.empty() || std::find(matches.begin(), matches.end(), name) != matches.end())
+    return name;
+  return matches.front();
+}
+
+void NameIndex::Add(const std::string &name) {
+  std::vector<std::string> &names = byUpper_[Upper(name)];
+  if (std::find(names.begin(), names.end(), name) == names.end())
+    names.push_back(name);
+}
+
+void NameIndex::Remove(const std::string &name) {
+  const auto found = byUpper_.find(Upper(name));
+  if (found == byUpper_.end())
+    return;
+  std::vector<std::string> &names = found->second;
+  names.erase(std::remove(names.begin(), names.end(), name), names.end());
+}

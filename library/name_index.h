@@ -1,0 +1,25 @@
+#pragma once
+
+#include <filesystem>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <vector>
+
+// The plain files of one folder by upper-cased name, listed once, so that any number of
+// case-insensitive look-ups costs a single listing.
+class NameIndex {
+public:
+  explicit NameIndex(const std::filesystem::path &folder);
+  // The names of the folder's files that equal `name` in any letter case.
+  const std::vector<std::string> &Matches(std::string_view name) const;
+  // The name a copy of `name` is stored under: the existing file of that name in any case, so
+  // that the folder never holds two files differing only in case; `name` itself otherwise.
+  std::string TargetName(const std::string &name) const;
+  // Notes that `name` now exists, or no longer does.
+  void Add(const std::string &name);
+  void Remove(const std::string &name);
+
+private:
+  std::unordered_map<std::string, std::vector<std::string>> byUpper_;
+};

@@ -1,0 +1,79 @@
+#include "library/safe_copy.h"
+
+#include "app/names.h"
+
+#include <system_error>
+
+#ifdef _WIN32
+#include <windows.h>
+#endif
+
+namespace fs = std::filesystem;
+
+#ifdef _WIN32
+// Hidden, system and archive cannot be told apart cheaply here: every file is made normal.
+static bool IsNormal(const fs::path &) { return false; }
+
+bool MakeNormal(const fs::path &path, Failures &failures) {
+  if (SetFileAttributesW(path.c_str(), FILE_ATTRIBUTE_NORMAL))
+    return true;
+  failures.Add(path, "cannot be made writable (" +
+                         std::system_category().message(static_cast<int>(GetLastError())) + ")");
+  return false;
+}
+#else
+static bool IsNormal(const fs::path &path) {
+  std::error_code error;
+  return (fs::status(path, error).permissions() & fs::perms::owner_write) != fs::perms::none;
+}
+
+bool MakeNormal(const fs::path &path, Failures &failures) {
+  std::error_code error;
+  const fs::perms perms = fs::status(path, error).permissions();
+  if (!error && (perms & fs::perms::owner_write) != fs::perms::none)
+    return true;
+  if (!error)
+    fs::permissions(path, perms | fs::perms::owner_write, fs::perm_options::replace, error);
+  if (!error)
+    return true;
+  failures.Add(path, "cannot be made writable (" + error.message() + ")");
+  return false;
+}
+#endif
+
+// Removes a temporary copy left by a failed attempt, but never a folder that happens to carry
+// its name.
+static void DropTemporary(const fs::path &temporary) {
+  std::error_code error;
+  if (fs::is_regular_file(temporary, error))
+    fs::remove(temporary, error);
+}
+
+bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures) {
+  fs::path temporary = target;
+  temporary += ".partial";
+  std::error_code error;
+  fs::copy_file(source, temporary, fs::copy_options::overwrite_existing, error);
+  if (error) {
+    failures.Add(source,
+                 "cannot be copied to " + DisplayPath(target) + " (" + error.message() + ")");
+    DropTemporary(temporary);
+    return false;
+  }
+#ifdef _WIN32
+  // Windows refuses to replace a read-only file; a missing target is no failure here.
+  SetFileAttributesW(target.c_str(), FILE_ATTRIBUTE_NORMAL);
+#endif
+  fs::rename(temporary, target, error);
+  if (error) {
+    failures.Add(target, "cannot be replaced (" + error.message() + ")");
+    DropTemporary(temporary);
+    return false;
+  }
+  // The copy carries the source's attributes, so a normal source leaves nothing to do.
+  if (!IsNormal(source)) {
+    MakeNormal(source, failures);
+    MakeNormal(target, failures);
+  }
+  return true;
+}

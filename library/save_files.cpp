@@ -1,0 +1,38 @@
+#include "library/save_files.h"
+
+#include "app/names.h"
+#include "library/game_places.h"
+#include "library/listing.h"
+#include "library/name_index.h"
+#include "library/safe_copy.h"
+
+#include <system_error>
+
+namespace fs = std::filesystem;
+
+bool IsCampaignPath(const fs::path &folder) {
+  for (const fs::path &part : folder) {
+    const std::string name = NameText(part);
+    if (StartsWith(name, "C ") || StartsWith(name, "C-"))
+      return true;
+  }
+  return false;
+}
+
+void CarrySaveFiles(const fs::path &eawDir, const fs::path &campaign, Failures &failures) {
+  const fs::path savedata = PlaceFolder(eawDir, Place::Savedata);
+  NameIndex campaignFiles(campaign);
+  // One listing: each file is tried once, so a file that cannot be moved ends the work.
+  for (const std::string &name : ListFiles(savedata, "*.sve")) {
+    const fs::path source = Child(savedata, name);
+    const std::string target = campaignFiles.TargetName(name);
+    if (!CopyReplacing(source, Child(campaign, target), failures))
+      continue;
+    campaignFiles.Add(target);
+    std::error_code error;
+    fs::remove(source, error);
+    if (error)
+      failures.Add(source, "was copied to " + DisplayPath(campaign) + " but cannot be deleted (" +
+                               error.message() + ")");
+  }
+}

@@ -1,0 +1,14 @@
+#pragma once
+
+#include "app/failures.h"
+
+#include <filesystem>
+
+// Whether `folder` is a campaign folder or lies inside one: a component of its path starts with
+// "C " or "C-" (case-sensitive).
+bool IsCampaignPath(const std::filesystem::path &folder);
+// Moves every save file ("*.sve") of the game's "Savedata" into `campaign`: each is deleted from
+// "Savedata" only after its copy is complete. A file that cannot be moved stays where it is and is
+// recorded in `failures`; the others are still moved.
+void CarrySaveFiles(const std::filesystem::path &eawDir, const std::filesystem::path &campaign,
+                    Failures &failures);

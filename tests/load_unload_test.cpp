@@ -1,0 +1,141 @@
+#include "library/listing.h"
+#include "library/move_in.h"
+#include "library/move_out.h"
+#include "library/save_files.h"
+#include "tests/recording_caption.h"
+#include "tests/test_folder.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+struct Game {
+  TestFolder folder;
+  AppState state = StateFor(folder.Path());
+  RecordingCaption caption;
+  Failures failures;
+
+  Game() { state.Ready = true; }
+  fs::path Addon(const std::string &name) const { return folder.MakeFolder("ZEP128/" + name); }
+  void Load(const std::string &name) { MoveIn(state, Addon(name), caption, failures); }
+  void Unload(const std::string &name) { MoveOut(state, Addon(name), caption, failures); }
+  bool Shown(const std::string &text) const {
+    return std::count(caption.shown.begin(), caption.shown.end(), text) > 0;
+  }
+};
+
+} // namespace
+
+TEST(MoveIn, PutsEachFileWhereTheGameLooksForIt) {
+  Game game;
+  game.folder.MakeFolder("SAVEDATA");
+  game.folder.Write("TITLE.BMP", "old");
+  for (const char *name :
+       {"A.MSN", "b.sve", "C.BGM", "readme.txt", "title.bmp", "mypic", "Contents.TXT",
+        "eca_note.dat", "model.ldr", "pic.jpg", "skin.PCX", "anim.gif"})
+    game.folder.Write(std::string("ZEP128/S-All/") + name, name);
+  game.Load("S-All");
+
+  EXPECT_EQ(game.folder.Read("SAVEDATA/A.MSN"), "A.MSN");
+  EXPECT_EQ(game.folder.Read("SAVEDATA/b.sve"), "b.sve");
+  EXPECT_EQ(game.folder.Read("Music/C.BGM"), "C.BGM");
+  EXPECT_EQ(game.folder.Read("readme.txt"), "readme.txt");
+  // The game's own file of that name in another case is replaced, not doubled.
+  EXPECT_EQ(game.folder.Read("TITLE.BMP"), "title.bmp");
+  EXPECT_FALSE(game.folder.Exists("title.bmp"));
+  EXPECT_EQ(ListFolders(game.folder.Path()).size(), 3u); // Music, SAVEDATA, ZEP128
+  for (const char *kept :
+       {"mypic", "Contents.TXT", "eca_note.dat", "model.ldr", "pic.jpg", "skin.PCX", "anim.gif"})
+    EXPECT_FALSE(game.folder.Exists(kept)) << kept;
+  EXPECT_TRUE(game.Shown("Please wait- copying: :readme.txt"));
+  EXPECT_EQ(game.caption.text, "Selector");
+  EXPECT_TRUE(game.failures.Empty());
+}
+
+TEST(MoveIn, ReadOnlyFileArrivesWritableAndBecomesWritableInTheLibrary) {
+  Game game;
+  const fs::path source = game.folder.Write("ZEP128/S-Ro/planes.dat");
+  SetReadOnly(source, true);
+  game.Load("S-Ro");
+  EXPECT_TRUE(IsWritable(game.folder.Path() / "planes.dat"));
+  EXPECT_TRUE(IsWritable(source));
+}
+
+TEST(MoveIn, CopiesNothingWhileNotReady) {
+  Game game;
+  game.folder.Write("ZEP128/S-One/one.dat");
+  game.state.Ready = false;
+  game.Load("S-One");
+  EXPECT_FALSE(game.folder.Exists("one.dat"));
+  EXPECT_TRUE(game.caption.shown.empty());
+}
+
+TEST(MoveIn, FileThatCannotBeCopiedIsSkippedAndReported) {
+  Game game;
+  for (const char *name : {"a.dat", "b.dat", "c.dat", "d.dat", "e.msn"})
+    game.folder.Write(std::string("ZEP128/S-Mix/") + name, "new");
+  game.folder.MakeFolder("b.dat");         // the destination is a folder
+  game.folder.MakeFolder("c.dat.partial"); // so is the temporary copy
+  game.folder.Write("savedata");           // "Savedata" cannot be created
+  game.Load("S-Mix");
+
+  EXPECT_EQ(game.folder.Read("a.dat"), "new");
+  EXPECT_EQ(game.folder.Read("d.dat"), "new");
+  EXPECT_TRUE(fs::is_directory(game.folder.Path() / "b.dat"));
+  EXPECT_TRUE(fs::is_directory(game.folder.Path() / "c.dat.partial"));
+  EXPECT_FALSE(game.folder.Exists("c.dat"));
+  EXPECT_FALSE(game.folder.Exists("b.dat.partial"));
+  const std::string message = game.failures.Message("");
+  for (const char *failed : {"b.dat", "c.dat", "e.msn", "savedata"})
+    EXPECT_NE(message.find(failed), std::string::npos) << failed;
+}
+
+TEST(MoveOut, DeletesOnlyTheCopiesLoadingMade) {
+  Game game;
+  for (const char *name : {"a.msn", "c.bgm", "planes.dat", "gone.dat", "dup.dat", "contents.txt",
+                           "mypic", "pic.jpg", "keep.sve"})
+    game.folder.Write(std::string("ZEP128/S-Out/") + name);
+  for (const char *name : {"Savedata/A.MSN", "Music/c.bgm", "PLANES.DAT", "dup.dat", "DUP.DAT",
+                           "contents.txt", "MYPIC", "pic.jpg", "Savedata/keep.sve"})
+    game.folder.Write(name);
+  game.Unload("S-Out");
+
+  for (const char *gone : {"Savedata/A.MSN", "Music/c.bgm", "PLANES.DAT"})
+    EXPECT_FALSE(game.folder.Exists(gone)) << gone;
+  // Two files matching one name is no copy of ours; the game's own files and saves stay.
+  for (const char *kept :
+       {"dup.dat", "DUP.DAT", "contents.txt", "MYPIC", "pic.jpg", "Savedata/keep.sve"})
+    EXPECT_TRUE(game.folder.Exists(kept)) << kept;
+  EXPECT_TRUE(game.failures.Empty()); // gone.dat was deleted by hand
+  EXPECT_TRUE(game.Shown("Deleting PLANES.DAT"));
+  EXPECT_EQ(game.caption.text, "Selector");
+  EXPECT_EQ(game.folder.Read("ZEP128/FoldersLoaded.txt"), "\r\n");
+}
+
+TEST(MoveOut, CampaignTakesEverySaveFileHome) {
+  Game game;
+  game.folder.Write("ZEP128/C-War/war.msn");
+  for (const char *name : {"Savedata/war.msn", "Savedata/a.sve", "Savedata/B.SVE", "Savedata/c.sve",
+                           "Savedata/other.msn"})
+    game.folder.Write(name, name);
+  game.folder.MakeFolder("ZEP128/C-War/c.sve"); // c.sve cannot be moved
+  game.Unload("C-War");
+
+  EXPECT_EQ(game.folder.Read("ZEP128/C-War/a.sve"), "Savedata/a.sve");
+  EXPECT_EQ(game.folder.Read("ZEP128/C-War/B.SVE"), "Savedata/B.SVE");
+  EXPECT_EQ(ListFiles(game.folder.Path() / "Savedata"),
+            (std::vector<std::string>{"c.sve", "other.msn"}));
+  EXPECT_NE(game.failures.Message("").find("c.sve"), std::string::npos);
+}
+
+TEST(MoveOut, CampaignIsNamedByCAndABlankOrHyphen) {
+  EXPECT_TRUE(IsCampaignPath("/games/ZEP128/C-War"));
+  EXPECT_TRUE(IsCampaignPath("/games/ZEP128/C War"));
+  EXPECT_TRUE(IsCampaignPath("/C-games/eaw/ZEP128/S-Sky"));
+  EXPECT_FALSE(IsCampaignPath("/games/ZEP128/Cwar"));
+  EXPECT_FALSE(IsCampaignPath("/games/ZEP128/c-war"));
+}

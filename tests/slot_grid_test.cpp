@@ -1,0 +1,88 @@
+#include "app/names.h"
+#include "app/text_file.h"
+#include "library/grid_builder.h"
+#include "library/grid_click.h"
+#include "library/listing.h"
+#include "slots/leading_number.h"
+#include "slots/plane_set.h"
+#include "tests/recording_caption.h"
+#include "tests/test_folder.h"
+
+#include <gtest/gtest.h>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+// A description file with the aircraft, the slot and whatever lines from 166 on.
+std::string Description(const std::string &aircraft, const std::string &slot,
+                        const std::vector<std::string> &skinLines) {
+  std::vector<std::string> lines(165, "0");
+  lines[0] = aircraft;
+  lines[1] = slot;
+  lines.insert(lines.end(), skinLines.begin(), skinLines.end());
+  return JoinCrLf(lines);
+}
+
+} // namespace
+
+TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
+  TestFolder game;
+  AppState state = StateFor(game.Path());
+  state.Ready = true;
+  state.Slots.currentCellColour = 0xFFFFFF;
+  const std::string pack = "ZEP128/F-Pack/";
+  game.Write(pack + "P-Lightning/a.zep",
+             Description("P-38 Lightning", "3 ", {"112", "51", "56", "104", "65"}));
+  game.Write(pack + "P-Lightning/b.zep", Description("Other", "9", {}));
+  game.MakeFolder(pack + "P-Empty");
+  game.Write(pack + "p-lower/c.zep", "x");
+  game.Write(pack + "Sounds/P-Inner/d.zep", "x");
+  game.Write("ZEP128/F-Plain/planes.dat");
+  BuildFolderRows(state.Unigrid, {"F"}, ListFolders(state.LibDir));
+  RecordingCaption caption;
+  Failures failures;
+
+  state.Unigrid.currentRow = 1; // F-Pack
+  UnigridClick(state, caption, failures);
+  EXPECT_TRUE(state.PlaneSetFound);
+  EXPECT_TRUE(state.Slots.frameVisible);
+  EXPECT_TRUE(state.Slots.gridVisible);
+  EXPECT_EQ(state.GridBackColor, 0xFFFFFFu);
+  EXPECT_EQ(state.Slots.label, DisplayPath(game.Path() / "ZEP128" / "F-Pack") + "/");
+  ASSERT_EQ(state.Slots.rows.size(), 2u);
+  EXPECT_EQ(state.Slots.rows[0].folder, "P-Empty");
+  EXPECT_EQ(state.Slots.rows[0].aircraft + state.Slots.rows[0].skinSlot, "");
+  EXPECT_EQ(state.Slots.rows[1].folder, "P-Lightning");
+  EXPECT_EQ(state.Slots.rows[1].aircraft, "P-38 Lightning");
+  EXPECT_EQ(state.Slots.rows[1].plnSlot, "3 ");
+  EXPECT_EQ(state.Slots.rows[1].skinSlot, "P38H");
+
+  state.Unigrid.currentRow = 2; // F-Plain replaces F-Pack
+  UnigridClick(state, caption, failures);
+  EXPECT_FALSE(state.PlaneSetFound);
+  EXPECT_FALSE(state.Slots.frameVisible);
+  EXPECT_EQ(state.Unigrid.rows[1].mark, "");
+
+  UnigridClick(state, caption, failures); // unload F-Plain
+  EXPECT_TRUE(state.Slots.rows.empty());
+  EXPECT_FALSE(state.Slots.frameVisible);
+  EXPECT_TRUE(failures.Empty());
+}
+
+TEST(SlotGrid, SkinCodeTakesOnlyCharacterCodesThatExist) {
+  TestFolder folder;
+  folder.Write("P-Short/a.zep", Description("Short", "1", {"112", "51"}));
+  folder.Write("P-Odd/a.zep", Description("Odd", "1", {" 112.9", "300", "-1", "x"}));
+  Failures failures;
+  EXPECT_EQ(ReadPlaneSet(folder.Path() / "P-Short", failures).skinSlot, "P3");
+  EXPECT_EQ(ReadPlaneSet(folder.Path() / "P-Odd", failures).skinSlot, std::string("P\0", 2));
+}
+
+TEST(SlotGrid, LeadingWholeNumber) {
+  EXPECT_EQ(LeadingWholeNumber("104"), 104);
+  EXPECT_EQ(LeadingWholeNumber("\t 56.99 rest"), 56);
+  EXPECT_EQ(LeadingWholeNumber("-3"), -3);
+  EXPECT_EQ(LeadingWholeNumber("abc"), 0);
+  EXPECT_GT(LeadingWholeNumber("99999999999999999999999999"), 255);
+}
