@@ -232,8 +232,13 @@ void MainWindow::Unigrid_Click(const QModelIndex &index) {
 
 void MainWindow::Unigrid_KeyPress(int key) {
   const QModelIndex current = c_.Unigrid->currentIndex();
-  if (key == 13 && current.isValid())
-    Unigrid_Click(current);
+  if (!current.isValid())
+    return;
+  state_.Unigrid.currentRow = current.row() + 1;
+  Failures failures;
+  UnigridKeyPress(state_, key, caption_, failures);
+  ShowGridChanges();
+  Tell(failures, "Some files could not be handled:");
 }
 
 bool MainWindow::eventFilter(QObject *watched, QEvent *event) {
@@ -254,7 +259,7 @@ bool MainWindow::eventFilter(QObject *watched, QEvent *event) {
   } else if (watched == c_.Unigrid && event->type() == QEvent::KeyPress) {
     auto *key = static_cast<QKeyEvent *>(event);
     if (key->key() == Qt::Key_Return || key->key() == Qt::Key_Enter) {
-      Unigrid_KeyPress(13);
+      Unigrid_KeyPress(kEnterKey);
       return true;
     }
     // Typed characters do nothing; arrow keys still move the current row.

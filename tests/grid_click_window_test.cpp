@@ -1,0 +1,173 @@
+#include "tests/test_folder.h"
+#include "tests/window_driver.h"
+
+#include <QTableWidget>
+#include <QTest>
+#include <gtest/gtest.h>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+// A game folder with "Savedata", "Music" and a library of the given category lines.
+void MakeGame(const TestFolder &game, const std::string &categories) {
+  game.MakeFolder("Savedata");
+  game.MakeFolder("Music");
+  game.Write("ZEP128/zep.ini", categories);
+}
+
+QColor NameCellColour(WindowDriver &driver, int row) {
+  return driver.Grid()->model()->index(row - 1, 1).data(Qt::BackgroundRole).value<QColor>();
+}
+
+QString Mark(WindowDriver &driver, int row) {
+  return driver.Grid()->model()->index(row - 1, 2).data().toString();
+}
+
+const QColor kGreen(192, 255, 192);
+
+} // namespace
+
+TEST(GridClickWindow, LoadCopiesEachFileToItsPlaceAndUnloadDeletesTheCopies) {
+  TestFolder game;
+  MakeGame(game, "Singles: Q\r\n");
+  const char *names[] = {"a.MSN",    "b.sve", "c.BGM", "d.txt", "mypic", "contents.txt",
+                         "eca1.dat", "e.ldr", "f.jpg", "g.pcx", "h.gif", "i.bmp"};
+  for (const char *name : names)
+    game.Write(std::string("ZEP128/Q-Mix/") + name, name);
+  SetReadOnly(game.Path() / "ZEP128/Q-Mix/d.txt", true);
+  WindowDriver driver(game.Path());
+  const QString caption = driver.Window().windowTitle();
+
+  driver.ClickRow(1, 2);
+  EXPECT_EQ(game.Read("Savedata/a.MSN"), "a.MSN");
+  EXPECT_TRUE(game.Exists("Savedata/b.sve"));
+  EXPECT_TRUE(game.Exists("Music/c.BGM"));
+  EXPECT_TRUE(game.Exists("d.txt"));
+  EXPECT_TRUE(game.Exists("i.bmp"));
+  for (const char *kept : {"mypic", "contents.txt", "eca1.dat", "e.ldr", "f.jpg", "g.pcx", "h.gif"})
+    EXPECT_FALSE(game.Exists(kept)) << kept;
+  EXPECT_TRUE(IsWritable(game.Path() / "d.txt"));
+  EXPECT_TRUE(IsWritable(game.Path() / "ZEP128/Q-Mix/d.txt"));
+  EXPECT_EQ(NameCellColour(driver, 1), kGreen);
+  EXPECT_EQ(Mark(driver, 1), "S");
+  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "Q-Mix\r\n\r\n");
+  EXPECT_EQ(driver.Window().windowTitle(), caption);
+
+  fs::remove(game.Path() / "i.bmp");
+  driver.ClickRow(1);
+  for (const char *copy : {"Savedata/a.MSN", "Music/c.BGM", "d.txt"})
+    EXPECT_FALSE(game.Exists(copy)) << copy;
+  EXPECT_TRUE(game.Exists("Savedata/b.sve"));
+  EXPECT_EQ(Mark(driver, 1), "");
+  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "\r\n");
+  EXPECT_TRUE(driver.TakeMessages().isEmpty());
+}
+
+TEST(GridClickWindow, SingleSelectionSwapsAndMultiSelectionKeepsBoth) {
+  TestFolder game;
+  MakeGame(game, "Skins: S\r\nSounds: N\r\n");
+  game.Write("ZEP128/S-one/one.dat");
+  game.Write("ZEP128/S-two/two.dat");
+  game.Write("ZEP128/N-a/a.wav");
+  game.Write("ZEP128/N-b/b.wav");
+  WindowDriver driver(game.Path());
+
+  driver.ClickRow(1);
+  driver.ClickRow(2);
+  EXPECT_FALSE(game.Exists("one.dat"));
+  EXPECT_TRUE(game.Exists("two.dat"));
+  EXPECT_EQ(Mark(driver, 1), "");
+  EXPECT_EQ(Mark(driver, 2), "S");
+
+  driver.ClickRow(3);
+  driver.Grid()->setCurrentIndex(driver.Grid()->model()->index(3, 1));
+  driver.PressGridKey(Qt::Key_Return);
+  driver.PressGridKey(Qt::Key_A);
+  EXPECT_TRUE(game.Exists("a.wav"));
+  EXPECT_TRUE(game.Exists("b.wav"));
+  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "S-two\r\nN-a\r\nN-b\r\n\r\n");
+}
+
+TEST(GridClickWindow, CampaignSwapCarriesEverySaveFileIntoTheOtherCampaign) {
+  TestFolder game;
+  MakeGame(game, "Campaigns: C\r\n");
+  game.Write("ZEP128/C first/first.msn");
+  game.Write("ZEP128/C-second/second.msn");
+  WindowDriver driver(game.Path());
+  driver.ClickRow(1);
+  game.Write("Savedata/pilot1.sve", "career");
+  game.Write("Savedata/PILOT2.SVE", "career 2");
+  driver.ClickRow(2);
+  EXPECT_EQ(game.Read("ZEP128/C first/pilot1.sve"), "career");
+  EXPECT_EQ(game.Read("ZEP128/C first/PILOT2.SVE"), "career 2");
+  EXPECT_FALSE(game.Exists("Savedata/pilot1.sve"));
+  EXPECT_FALSE(game.Exists("Savedata/first.msn"));
+  EXPECT_TRUE(game.Exists("Savedata/second.msn"));
+  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "C-second\r\n\r\n");
+}
+
+TEST(GridClickWindow, ReplayAtStartTouchesNoFile) {
+  TestFolder game;
+  MakeGame(game, "Skins: S\r\nSkins again: S\r\n");
+  game.Write("ZEP128/S-one/one.dat");
+  game.Write("ZEP128/S-two/two.dat");
+  game.Write("one.dat", "loaded earlier");
+  game.Write("ZEP128/FoldersLoaded.txt", "S-one\r\nS-two\r\n\r\n");
+  WindowDriver driver(game.Path());
+  EXPECT_EQ(game.Read("one.dat"), "loaded earlier");
+  EXPECT_FALSE(game.Exists("two.dat"));
+  // Rows 1 to 4 are S-one, S-two, S-one, S-two: each replayed click unloads the row before it.
+  for (int row : {1, 2, 3})
+    EXPECT_EQ(Mark(driver, row), "") << row;
+  EXPECT_EQ(Mark(driver, 4), "S");
+  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "S-one\r\nS-two\r\n\r\n");
+}
+
+TEST(GridClickWindow, FlightModelShowsItsPlaneSetsUntilUnloaded) {
+  TestFolder game;
+  MakeGame(game, "Flight models: F\r\n");
+  std::string zep = "Lightning\r\n7 \r\n";
+  for (int line = 3; line <= 165; ++line)
+    zep += "0\r\n";
+  zep += "112\r\n51\r\n56\r\n104\r\n";
+  game.Write("ZEP128/F-Fast/P-Lightning/plane.zep", zep);
+  game.Write("ZEP128/F-Fast/flight.dat");
+  game.Write("ZEP128/F-Plain/flight.dat");
+  WindowDriver driver(game.Path());
+  auto *panel = driver.Find<QWidget>("SlotFrame");
+  auto *slotGrid = driver.Find<QTableWidget>("SlotGrid");
+
+  driver.ClickRow(1);
+  EXPECT_TRUE(panel->isVisible());
+  ASSERT_EQ(slotGrid->rowCount(), 2);
+  EXPECT_EQ(slotGrid->item(0, 3)->text(), "Aircraft");
+  EXPECT_EQ(slotGrid->item(1, 0)->text(), "P-Lightning");
+  EXPECT_EQ(slotGrid->item(1, 1)->text(), "7 ");
+  EXPECT_EQ(slotGrid->item(1, 2)->text(), "P38H");
+  EXPECT_EQ(slotGrid->item(1, 3)->text(), "Lightning");
+
+  driver.ClickRow(2);
+  EXPECT_FALSE(panel->isVisible());
+  driver.ClickRow(1);
+  EXPECT_TRUE(panel->isVisible());
+  driver.ClickRow(1);
+  EXPECT_FALSE(panel->isVisible());
+}
+
+TEST(GridClickWindow, ACopyThatFailsIsSkippedAndToldOnce) {
+  TestFolder game;
+  MakeGame(game, "Singles: Q\r\n");
+  for (const char *name : {"a.dat", "b.dat", "c.dat"})
+    game.Write(std::string("ZEP128/Q-Mix/") + name, name);
+  game.MakeFolder("b.dat/in-the-way");
+  WindowDriver driver(game.Path());
+  driver.ClickRow(1);
+  EXPECT_EQ(game.Read("a.dat"), "a.dat");
+  EXPECT_EQ(game.Read("c.dat"), "c.dat");
+  EXPECT_EQ(Mark(driver, 1), "S");
+  const QStringList messages = driver.TakeMessages();
+  ASSERT_EQ(messages.size(), 1);
+  EXPECT_TRUE(messages[0].contains("b.dat"));
+  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "Q-Mix\r\n\r\n");
+}
