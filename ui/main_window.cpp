@@ -42,7 +42,8 @@ MainWindow::MainWindow(const fs::path &eawDir)
   WireEvents();
 }
 
-MainWindow::~MainWindow() = default;
+// The widgets outlive the state they show by a moment: detach the grid from it first.
+MainWindow::~MainWindow() { c_.Unigrid->setModel(nullptr); }
 
 void MainWindow::WireEvents() {
   connect(c_.Command3, &QPushButton::clicked, this, &MainWindow::Command3_Click);
