@@ -51,5 +51,3 @@ void SetReadOnly(const fs::path &path, bool readOnly) {
   const fs::perms write = fs::perms::owner_write | fs::perms::group_write | fs::perms::others_write;
   fs::permissions(path, write, readOnly ? fs::perm_options::remove : fs::perm_options::add);
 }
-
-bool PermissionsAreIgnored() { return ::geteuid() == 0; }

@@ -27,5 +27,3 @@ private:
 bool IsWritable(const std::filesystem::path &path);
 // Makes `path` read-only (or writable again).
 void SetReadOnly(const std::filesystem::path &path, bool readOnly);
-// Whether the tests run with the power to ignore file permissions (root).
-bool PermissionsAreIgnored();
