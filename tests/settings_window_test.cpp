@@ -1,0 +1,123 @@
+#include "tests/test_folder.h"
+#include "tests/window_driver.h"
+
+#include <QStandardPaths>
+#include <QTest>
+#include <gtest/gtest.h>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+void PressEnterIn(WindowDriver &driver, const char *box, const QString &text) {
+  auto *edit = driver.Find<QLineEdit>(box);
+  edit->setFocus();
+  edit->setText(text);
+  QTest::keyClick(edit, Qt::Key_Return);
+}
+
+int StartedCount(const fs::path &folder) {
+  int count = 0;
+  for (const auto &entry : fs::directory_iterator(folder))
+    count += entry.path().filename().string().rfind("started-", 0) == 0;
+  return count;
+}
+
+} // namespace
+
+TEST(SettingsWindow, BoxesShowTheLastKeyAndEnterRewritesEveryKeyLine) {
+  TestFolder game;
+  const fs::path ini = game.Write("eaw.ini", "[A]\nWidth=0800\n Height=5\nheight=6\n[B]\n"
+                                             "Width=1024 ; wide\nMonth=abc\nDay=14");
+  SetReadOnly(ini, true);
+  WindowDriver driver(game.Path());
+  EXPECT_EQ(driver.Find<QLineEdit>("Text5")->text(), "1024");
+  EXPECT_EQ(driver.Find<QLineEdit>("Text88")->text(), "0");
+  EXPECT_EQ(driver.Find<QLineEdit>("Text6")->text(), "");
+  EXPECT_EQ(driver.Find<QLineEdit>("Text4")->text(), "0");
+
+  PressEnterIn(driver, "Text7", "");
+  EXPECT_EQ(game.Read("eaw.ini"), "[A]\r\nWidth=1024\r\n Height=5\r\nheight=6\r\n[B]\r\n"
+                                  "Width=1024\r\nMonth=0\r\nDay=\r\n");
+  EXPECT_TRUE(IsWritable(ini));
+  EXPECT_FALSE(game.Exists("eaw.ink"));
+  EXPECT_TRUE(driver.TakeMessages().isEmpty());
+
+  // A temporary name taken by a folder makes the write fail: the file stays as it was.
+  game.Write("eaw.ini.partial/in-the-way");
+  PressEnterIn(driver, "Text5", "640");
+  EXPECT_EQ(game.Read("eaw.ini"), "[A]\r\nWidth=1024\r\n Height=5\r\nheight=6\r\n[B]\r\n"
+                                  "Width=1024\r\nMonth=0\r\nDay=\r\n");
+  const QStringList messages = driver.TakeMessages();
+  ASSERT_EQ(messages.size(), 1);
+  EXPECT_TRUE(messages[0].contains("eaw.ini"));
+}
+
+TEST(SettingsWindow, EditorShowsSavesAndHides) {
+  TestFolder game;
+  game.Write("eaw.ini", "[Screen]\r\nWidth=800\r\n");
+  WindowDriver driver(game.Path());
+  auto *editor = driver.Find<QWidget>("Frame21");
+  driver.Find<QTabWidget>("SSTab1")->setCurrentIndex(0);
+  QTest::mouseClick(driver.Find<QPushButton>("IniEdit"), Qt::LeftButton);
+  EXPECT_TRUE(editor->isVisible());
+  auto *text = driver.Find<QPlainTextEdit>("Text14");
+  EXPECT_EQ(text->toPlainText(), "[Screen]\nWidth=800\n");
+
+  QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
+  EXPECT_EQ(game.Read("eaw.ini"), "[Screen]\r\nWidth=800\r\n\r\n");
+
+  text->setPlainText("Width=1280\n");
+  QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
+  EXPECT_EQ(driver.Find<QLineEdit>("Text5")->text(), "1280");
+  QTest::mouseClick(editor, Qt::LeftButton, {}, QPoint(editor->width() - 5, editor->height() - 5));
+  EXPECT_FALSE(editor->isVisible());
+}
+
+TEST(SettingsWindow, MusicListSwitchesThereAndBack) {
+  TestFolder game;
+  game.Write("Music.ini", "Swing\r\n..\r\nClassic\r\nRock\r\n");
+  game.Write("Music/rock.bgm");
+  game.Write("Swing/swing.bgm");
+  game.Write("Classic/classic.bgm");
+  WindowDriver driver(game.Path());
+  auto *list = driver.Find<QListWidget>("List4");
+  auto *current = driver.Find<QLabel>("Label11");
+  ASSERT_EQ(list->count(), 2);
+  EXPECT_EQ(list->item(0)->text(), "Swing");
+  EXPECT_EQ(current->text(), "Rock");
+
+  QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
+                    list->visualItemRect(list->item(0)).center());
+  EXPECT_TRUE(game.Exists("Music/swing.bgm"));
+  EXPECT_TRUE(game.Exists("Rock/rock.bgm"));
+  EXPECT_EQ(current->text(), "Swing");
+  ASSERT_EQ(list->count(), 2);
+  EXPECT_EQ(list->item(1)->text(), "Rock");
+
+  QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
+                    list->visualItemRect(list->item(1)).center());
+  EXPECT_TRUE(game.Exists("Music/rock.bgm"));
+  EXPECT_TRUE(game.Exists("Swing/swing.bgm"));
+  EXPECT_TRUE(game.Exists("Classic/classic.bgm"));
+  EXPECT_EQ(current->text(), "Rock");
+}
+
+TEST(SettingsWindow, FlyStartsTheGameEachTimeOrSaysWhyNot) {
+  TestFolder game;
+  WindowDriver driver(game.Path());
+  auto *fly = driver.Find<QPushButton>("delmsn");
+  QTest::mouseClick(fly, Qt::LeftButton);
+  const QStringList messages = driver.TakeMessages();
+  ASSERT_EQ(messages.size(), 1);
+  EXPECT_TRUE(messages[0].contains(QString::fromStdString((game.Path() / "eaw.exe").string())));
+  if (!QStandardPaths::findExecutable("wine").isEmpty())
+    GTEST_SKIP() << "wine would run the stand-in game";
+  const fs::path exe = game.Write("eaw.exe", "#!/bin/sh\ntouch \"$(dirname \"$0\")/started-$$\"\n");
+  fs::permissions(exe, fs::perms::owner_exec, fs::perm_options::add);
+  QTest::mouseClick(fly, Qt::LeftButton);
+  QTest::mouseClick(fly, Qt::LeftButton);
+  EXPECT_TRUE(QTest::qWaitFor([&] { return StartedCount(game.Path()) == 2; }, 5000));
+  EXPECT_TRUE(driver.Window().isVisible());
+  EXPECT_TRUE(driver.TakeMessages().isEmpty());
+}
