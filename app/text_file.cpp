@@ -67,27 +67,31 @@ static bool WriteWhole(const fs::path &path, const std::string &bytes) {
   return !out.fail();
 }
 
-// Removes what a failed write left, but never a folder that merely had the temporary name.
-static void RemoveTemporary(const fs::path &temporary) {
+fs::path PartialPath(const fs::path &target) {
+  fs::path partial = target;
+  partial += ".partial";
+  return partial;
+}
+
+void RemovePartial(const fs::path &partial) {
   std::error_code error;
-  if (fs::is_regular_file(temporary, error))
-    fs::remove(temporary, error);
+  if (fs::is_regular_file(partial, error))
+    fs::remove(partial, error);
 }
 
 bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures &failures) {
-  fs::path temporary = target;
-  temporary += ".partial";
+  const fs::path temporary = PartialPath(target);
   errno = 0;
   if (!WriteWhole(temporary, bytes)) {
     failures.Add(target, "cannot be written (" + LastErrorText() + ")");
-    RemoveTemporary(temporary);
+    RemovePartial(temporary);
     return false;
   }
   std::error_code error;
   fs::rename(temporary, target, error);
   if (error) {
     failures.Add(target, "cannot be replaced (" + error.message() + ")");
-    RemoveTemporary(temporary);
+    RemovePartial(temporary);
     return false;
   }
   return true;

@@ -20,5 +20,9 @@ std::string JoinCrLf(const std::vector<std::string> &lines);
 // is always either the old or the new one. Returns false, with the reason, on failure.
 bool WriteAtomically(const std::filesystem::path &target, const std::string &bytes,
                      Failures &failures);
+// The temporary file beside `target` that a replacement is written to before it is renamed.
+std::filesystem::path PartialPath(const std::filesystem::path &target);
+// Removes what a failed replacement left, but never a folder that merely has the temporary name.
+void RemovePartial(const std::filesystem::path &partial);
 // The reason of the last failed C library call, for messages.
 std::string LastErrorText();

@@ -1,6 +1,7 @@
 #include "library/safe_copy.h"
 
 #include "app/names.h"
+#include "app/text_file.h"
 
 #include <system_error>
 
@@ -41,23 +42,14 @@ bool MakeNormal(const fs::path &path, Failures &failures) {
 }
 #endif
 
-// Removes a temporary copy left by a failed attempt, but never a folder that happens to carry
-// its name.
-static void DropTemporary(const fs::path &temporary) {
-  std::error_code error;
-  if (fs::is_regular_file(temporary, error))
-    fs::remove(temporary, error);
-}
-
 bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures) {
-  fs::path temporary = target;
-  temporary += ".partial";
+  const fs::path temporary = PartialPath(target);
   std::error_code error;
   fs::copy_file(source, temporary, fs::copy_options::overwrite_existing, error);
   if (error) {
     failures.Add(source,
                  "cannot be copied to " + DisplayPath(target) + " (" + error.message() + ")");
-    DropTemporary(temporary);
+    RemovePartial(temporary);
     return false;
   }
 #ifdef _WIN32
@@ -67,7 +59,7 @@ bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &fai
   fs::rename(temporary, target, error);
   if (error) {
     failures.Add(target, "cannot be replaced (" + error.message() + ")");
-    DropTemporary(temporary);
+    RemovePartial(temporary);
     return false;
   }
   // The copy carries the source's attributes, so a normal source leaves nothing to do.

@@ -21,22 +21,17 @@ Widget *Make(QWidget *parent, const char *name, QRect place, QPoint origin = {})
   return widget;
 }
 
-QLabel *MakeLabel(QWidget *parent, const char *name, const QString &text, QRect place,
-                  QPoint origin = {}) {
-  QLabel *label = Make<QLabel>(parent, name, place, origin);
-  label->setText(text);
-  label->setAlignment(Qt::AlignLeft | Qt::AlignTop);
-  // Fonts other than the Windows one are a little wider: a short caption may grow to stay whole.
-  label->resize(std::max(label->width(), label->sizeHint().width()), label->height());
-  return label;
-}
+enum class Wrap { No, Yes };
 
-QLabel *MakeWrappedLabel(QWidget *parent, const char *name, const QString &text, QRect place,
-                         QPoint origin = {}) {
+QLabel *MakeLabel(QWidget *parent, const char *name, const QString &text, QRect place,
+                  QPoint origin = {}, Wrap wrap = Wrap::No) {
   QLabel *label = Make<QLabel>(parent, name, place, origin);
   label->setText(text);
   label->setAlignment(Qt::AlignLeft | Qt::AlignTop);
-  label->setWordWrap(true);
+  label->setWordWrap(wrap == Wrap::Yes);
+  // Fonts other than the Windows one are a little wider: a short caption may grow to stay whole.
+  if (wrap == Wrap::No)
+    label->resize(std::max(label->width(), label->sizeHint().width()), label->height());
   return label;
 }
 
@@ -97,15 +92,14 @@ void BuildSettingsFrame(QWidget *page, QPoint origin, Controls &c) {
   c.Frame2->setTitle("User settings");
   c.Frame2->setStyleSheet("QGroupBox::title { color: #0000FF; }");
   QWidget *f = c.Frame2;
-  c.Label5 =
-      MakeWrappedLabel(f, "Label5", "User's PC natural resolution:", Twips(210, 360, 1695, 435));
+  c.Label5 = MakeLabel(f, "Label5", "User's PC natural resolution:", Twips(210, 360, 1695, 435), {},
+                       Wrap::Yes);
   MakeLabel(f, "Label30(0)", "Width", Twips(210, 930, 675, 315));
   c.Label18[0] = MakeLabel(f, "Label18(0)", "", Twips(990, 900, 630, 255));
   MakeLabel(f, "Label31(0)", "Height", Twips(210, 1380, 675, 315));
   c.Label18[1] = MakeLabel(f, "Label18(1)", "", Twips(990, 1320, 630, 255));
-  c.Label32 =
-      MakeWrappedLabel(f, "Label32", "Current settings:  Press \"Enter\" after changing any value",
-                       Twips(180, 1710, 1815, 945));
+  c.Label32 = MakeLabel(f, "Label32", "Current settings:  Press \"Enter\" after changing any value",
+                        Twips(180, 1710, 1815, 945), {}, Wrap::Yes);
   SetFont(c.Label32, 9.75);
   MakeLabel(f, "Label30(1)", "Width", Twips(150, 2880, 675, 315));
   c.Text5 = MakeBox(f, "Text5", Twips(960, 2820, 705, 375));
@@ -181,9 +175,9 @@ void BuildLoaderPage(QWidget *page, QPoint origin, Controls &c) {
   c.LoadFrame = Make<QFrame>(page, "LoadFrame", Twips(270, 660, 14370, 8415), origin);
   c.LoadFrame->setMouseTracking(true);
   QWidget *f = c.LoadFrame;
-  c.Label22 = MakeWrappedLabel(
+  c.Label22 = MakeLabel(
       f, "Label22", "Click on a white row to load a folder, or click on a green row to unload it.",
-      Twips(30, 180, 3645, 585));
+      Twips(30, 180, 3645, 585), {}, Wrap::Yes);
   c.Label9 = MakeLabel(f, "Label9", "Code letter", Twips(120, 900, 885, 255));
   c.Label6 = MakeLabel(f, "Label6", "", Twips(990, 840, 465, 315));
   c.Label33 = MakeLabel(f, "Label33", "Refresh!", Twips(1590, 810, 1125, 375));
@@ -195,7 +189,7 @@ void BuildLoaderPage(QWidget *page, QPoint origin, Controls &c) {
   Paint(c.List3, QColor("#FFC0C0"));
   c.List3->setMouseTracking(true);
   BuildFolderGrid(f, c);
-  c.Label15 = MakeWrappedLabel(f, "Label15", "Current Music", Twips(4140, 6540, 555, 375));
+  c.Label15 = MakeLabel(f, "Label15", "Current Music", Twips(4140, 6540, 555, 375), {}, Wrap::Yes);
   SetTextColour(c.Label15, QColor("#000080"));
   c.Label11 = MakeLabel(f, "Label11", "", Twips(4800, 6600, 2445, 345));
   SetTextColour(c.Label11, QColor("#000080"));
@@ -203,7 +197,7 @@ void BuildLoaderPage(QWidget *page, QPoint origin, Controls &c) {
   Paint(c.List4, QColor("#C0FFFF"));
   c.MyImage = Make<QLabel>(f, "MyImage", Twips(7890, 150, 6375, 5220));
   c.MyImage->setAlignment(Qt::AlignCenter);
-  c.MyLabel = MakeWrappedLabel(f, "MyLabel", "", Twips(8220, 5670, 1905, 480));
+  c.MyLabel = MakeLabel(f, "MyLabel", "", Twips(8220, 5670, 1905, 480), {}, Wrap::Yes);
   Paint(c.MyLabel, QColor("#FFE0C0"));
   c.Text9 = Make<QPlainTextEdit>(f, "Text9", Twips(7860, 5460, 6465, 2835));
   Paint(c.Text9, QColor("#C0C0FF"));
