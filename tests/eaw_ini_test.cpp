@@ -19,23 +19,6 @@ Shown Read(const TestFolder &game) {
 
 } // namespace
 
-TEST(EawIni, ReadsAndRewritesOnlyLinesThatBeginWithAKey) {
-  TestFolder game;
-  EXPECT_EQ(Read(game), Shown(6));
-  game.Write("EAW.INI", kIni);
-  EXPECT_EQ(Read(game), (Shown{"1024", "600", std::nullopt, "0", "0", "16"}));
-  Failures failures;
-  inisave(game.Path(), false, kTexts, failures);
-  EXPECT_EQ(game.Read("EAW.INI"), kIni);
-  inisave(game.Path(), true, kTexts, failures);
-  EXPECT_EQ(game.Read("EAW.INI"),
-            "[Screen]\r\nWidth=1280\r\nHeight=\r\n Width=5\r\nwidth=6\r\n"
-            "[Game]\r\nDay=12\r\nWidth=1280\r\nMonth=abc\r\nPlaneSetNumber=2\r\n");
-  EXPECT_EQ(Read(game), (Shown{"1280", "0", std::nullopt, "12", "0", "2"}));
-  EXPECT_TRUE(failures.Empty());
-  EXPECT_EQ(std::distance(std::filesystem::directory_iterator(game.Path()), {}), 1);
-}
-
 TEST(EawIni, ReadsAndWritesLinesEndedByLineFeedsAlone) {
   TestFolder game;
   game.Write("eaw.ini", "Width=640\nHeight=480\nSound=1\n");

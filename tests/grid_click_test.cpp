@@ -43,33 +43,6 @@ protected:
 
 } // namespace
 
-TEST_F(GridClick, LoadingOneFolderOfALetterUnloadsTheOther) {
-  game.Write("ZEP128/S-One/one.dat");
-  game.Write("ZEP128/S-Two/two.dat");
-  Build();
-  Click("S-One");
-  EXPECT_TRUE(game.Exists("one.dat"));
-  Click("S-Two");
-  EXPECT_FALSE(game.Exists("one.dat"));
-  EXPECT_TRUE(game.Exists("two.dat"));
-  EXPECT_EQ(Row("S-One").mark, "");
-  EXPECT_EQ(Row("S-One").nameColour, state.GridBackColor);
-  EXPECT_EQ(Row("S-Two").mark, "S");
-  EXPECT_EQ(Row("S-Two").nameColour, kLoadedColour);
-  EXPECT_EQ(Record(), "S-Two\r\n\r\n");
-}
-
-TEST_F(GridClick, MultiSelectionLettersLoadTogether) {
-  game.Write("ZEP128/N-One/one.dat");
-  game.Write("ZEP128/N-Two/two.dat");
-  Build();
-  Click("N-One");
-  Click("N-Two");
-  EXPECT_TRUE(game.Exists("one.dat"));
-  EXPECT_TRUE(game.Exists("two.dat"));
-  EXPECT_EQ(Record(), "N-One\r\nN-Two\r\n\r\n");
-}
-
 TEST_F(GridClick, GreenRowUnloadsEnterClicksOtherKeysAndHeaderDoNothing) {
   game.Write("ZEP128/S-One/one.dat");
   state.Unigrid.currentRow = 0;
@@ -87,20 +60,6 @@ TEST_F(GridClick, GreenRowUnloadsEnterClicksOtherKeysAndHeaderDoNothing) {
   EXPECT_FALSE(game.Exists("one.dat"));
   EXPECT_EQ(Row("S-One").mark, "");
   EXPECT_EQ(Record(), "\r\n");
-}
-
-TEST_F(GridClick, CampaignSwapCarriesEverySaveFileIntoTheOtherCampaign) {
-  game.Write("ZEP128/C-First/first.msn");
-  game.Write("ZEP128/C-Second/second.msn");
-  Build();
-  Click("C-First");
-  game.Write("Savedata/game1.sve", "one");
-  game.Write("Savedata/game2.sve", "two");
-  Click("C-Second");
-  EXPECT_EQ(game.Read("ZEP128/C-First/game1.sve"), "one");
-  EXPECT_EQ(game.Read("ZEP128/C-First/game2.sve"), "two");
-  EXPECT_EQ(ListFiles(game.Path() / "Savedata"), std::vector<std::string>{"second.msn"});
-  EXPECT_EQ(Record(), "C-Second\r\n\r\n");
 }
 
 TEST_F(GridClick, ReplayMarksRowsWithoutTouchingFiles) {

@@ -56,15 +56,6 @@ TEST(MoveIn, PutsEachFileWhereTheGameLooksForIt) {
   EXPECT_TRUE(game.failures.Empty());
 }
 
-TEST(MoveIn, ReadOnlyFileArrivesWritableAndBecomesWritableInTheLibrary) {
-  Game game;
-  const fs::path source = game.folder.Write("ZEP128/S-Ro/planes.dat");
-  SetReadOnly(source, true);
-  game.Load("S-Ro");
-  EXPECT_TRUE(IsWritable(game.folder.Path() / "planes.dat"));
-  EXPECT_TRUE(IsWritable(source));
-}
-
 TEST(MoveIn, CopiesNothingWhileNotReady) {
   Game game;
   game.folder.Write("ZEP128/S-One/one.dat");
@@ -114,22 +105,6 @@ TEST(MoveOut, DeletesOnlyTheCopiesLoadingMade) {
   EXPECT_TRUE(game.Shown("Deleting PLANES.DAT"));
   EXPECT_EQ(game.caption.text, "Selector");
   EXPECT_EQ(game.folder.Read("ZEP128/FoldersLoaded.txt"), "\r\n");
-}
-
-TEST(MoveOut, CampaignTakesEverySaveFileHome) {
-  Game game;
-  game.folder.Write("ZEP128/C-War/war.msn");
-  for (const char *name : {"Savedata/war.msn", "Savedata/a.sve", "Savedata/B.SVE", "Savedata/c.sve",
-                           "Savedata/other.msn"})
-    game.folder.Write(name, name);
-  game.folder.MakeFolder("ZEP128/C-War/c.sve"); // c.sve cannot be moved
-  game.Unload("C-War");
-
-  EXPECT_EQ(game.folder.Read("ZEP128/C-War/a.sve"), "Savedata/a.sve");
-  EXPECT_EQ(game.folder.Read("ZEP128/C-War/B.SVE"), "Savedata/B.SVE");
-  EXPECT_EQ(ListFiles(game.folder.Path() / "Savedata"),
-            (std::vector<std::string>{"c.sve", "other.msn"}));
-  EXPECT_NE(game.failures.Message("").find("c.sve"), std::string::npos);
 }
 
 TEST(MoveOut, CampaignIsNamedByCAndABlankOrHyphen) {

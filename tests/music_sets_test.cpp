@@ -38,20 +38,6 @@ TEST(MusicSets, ListsSetsWithFoldersAndShowsTheLastOneWithoutAsCurrent) {
   EXPECT_TRUE(failures.Empty());
 }
 
-TEST(MusicSets, SwitchesThereAndBackRestoringEveryFolder) {
-  TestFolder game;
-  MakeThreeSets(game);
-  Failures failures;
-  ASSERT_TRUE(SwitchMusic(game.Path(), "Set3", "Set1", failures));
-  EXPECT_EQ(game.Read("Music/a.bgm") + game.Read("Set3/a.bgm"), "13");
-  const MusicList list = FillMusicList(game.Path(), failures);
-  EXPECT_EQ(list.entries, (Names{"Set2", "Set3"}));
-  EXPECT_EQ(list.current, "Set1");
-  ASSERT_TRUE(SwitchMusic(game.Path(), "Set1", "Set3", failures));
-  ExpectUntouched(game);
-  EXPECT_TRUE(failures.Empty());
-}
-
 TEST(MusicSets, AFailedSwitchChangesNoFolderAndSaysSo) {
   TestFolder game;
   MakeThreeSets(game);
