@@ -304,7 +304,7 @@ void MainWindow::ShowSlotPanel() {
   c_.SlotFrame->setVisible(panel.frameVisible);
   c_.SlotLabel->setText(FromName(panel.label));
   c_.SlotGrid->setVisible(panel.gridVisible);
-  FillSlotGrid(c_.SlotGrid, panel, c_.SlotFrame->palette().color(QPalette::Window));
+  FillSlotGrid(c_.SlotGrid, panel, QColor(kSlotFrameColour));
 }
 
 void MainWindow::ShowPicture(QLabel *label, const fs::path &picture) {

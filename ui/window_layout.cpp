@@ -160,7 +160,8 @@ void BuildSlotPanel(QWidget *frame, Controls &c) {
   // the category list and the music list stay in view.
   c.SlotFrame = Make<QFrame>(frame, "SlotFrame", Twips(7860, 5460, 6465, 2835));
   c.SlotFrame->setFrameShape(QFrame::Box);
-  Paint(c.SlotFrame, QColor("#E0E0E0"));
+  c.SlotFrame->setStyleSheet(
+      QString("QFrame#SlotFrame { background-color: %1; }").arg(kSlotFrameColour));
   c.SlotLabel = MakeLabel(c.SlotFrame, "SlotLabel", "", Twips(60, 30, 6345, 255));
   c.SlotGrid = Make<QTableWidget>(c.SlotFrame, "SlotGrid", Twips(60, 300, 6345, 2475));
   c.SlotGrid->setFont(WindowFont(8));

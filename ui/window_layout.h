@@ -38,6 +38,9 @@ struct Controls {
   QTableWidget *SlotGrid;
 };
 
+// The slot panel's colour, also the colour of the slot grid's header cells.
+inline constexpr char kSlotFrameColour[] = "#E0E0E0";
+
 // The window's font at `points` size: the Windows dialog font or a look-alike.
 QFont WindowFont(double points);
 // The window's exact caption, 108 characters.
