@@ -24,5 +24,7 @@ QString LockPath(const std::filesystem::path &eawDir) {
 InstanceLock::InstanceLock(const std::filesystem::path &eawDir)
     : lock_(std::make_unique<QLockFile>(LockPath(eawDir))) {
   lock_->setStaleLockTime(0);
-  acquired_ = lock_->tryLock(0);
+  // Only another running instance refuses the start; a temporary folder that cannot hold the
+  // lock must not keep the player out.
+  acquired_ = lock_->tryLock(0) || lock_->error() != QLockFile::LockFailedError;
 }

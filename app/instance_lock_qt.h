@@ -9,7 +9,7 @@
 class InstanceLock {
 public:
   explicit InstanceLock(const std::filesystem::path &eawDir);
-  // Whether this is the only running instance for the game folder.
+  // Whether no other instance runs for the game folder.
   bool Acquired() const { return acquired_; }
 
 private:
