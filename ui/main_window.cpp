@@ -1,6 +1,7 @@
 #include "ui/main_window.h"
 
 #include "app/existence.h"
+#include "app/names.h"
 #include "app/startup.h"
 #include "library/category_view.h"
 #include "library/grid_click.h"
@@ -31,6 +32,17 @@
 #include <QTimer>
 
 namespace fs = std::filesystem;
+
+namespace {
+
+// The picture file `name` of the game folder, whatever its letter case; empty when there is none.
+fs::path GamePicture(const fs::path &eawDir, const char *name) {
+  const fs::path picture = FindAnyCase(eawDir, name);
+  FileCheck(picture);
+  return FileFound ? picture : fs::path();
+}
+
+} // namespace
 
 MainWindow::MainWindow(const fs::path &eawDir)
     : state_(StateFor(eawDir)), c_(BuildControls(this)), caption_(this),
@@ -89,20 +101,16 @@ void MainWindow::FormLoad() {
   ShowGridRows();
   EnsureRecord(state_, failures);
   ReplayRecord(state_, caption_, failures);
-  FileCheck(state_.EAWDir / "background");
-  state_.BackPic = FileFound ? state_.EAWDir / "background" : fs::path();
+  state_.BackPic = GamePicture(state_.EAWDir, "background");
   ShowPicture(c_.MyImage, state_.BackPic);
-  FileCheck(state_.EAWDir / "newpic");
-  ShowPicture(c_.Image3, FileFound ? state_.EAWDir / "newpic" : fs::path());
+  ShowPicture(c_.Image3, GamePicture(state_.EAWDir, "newpic"));
   c_.SSTab1->setCurrentIndex(0);
   c_.List3->setCurrentRow(0);
   List3_Click(0);
   state_.Ready = true;
   c_.SSTab1->setEnabled(true);
   ShowGridChanges();
-  FileCheck(state_.EAWDir / "Music.ini");
-  if (FileFound)
-    FillMusicList();
+  FillMusicList();
   if (!skipped.empty())
     failures.Add(SkippedLinesMessage(skipped));
   QTimer::singleShot(0, this, [this, failures] { Tell(failures, "Start-up could not do all:"); });
