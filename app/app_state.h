@@ -25,5 +25,6 @@ struct AppState {
   SlotPanel Slots;
 };
 
-// The state for the game folder `eawDir`, with `LibDir` beside it, before start-up.
+// The state for the game folder `eawDir`, with `LibDir` (its "ZEP128" in any case), before
+// start-up.
 AppState StateFor(const std::filesystem::path &eawDir);

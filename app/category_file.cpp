@@ -1,6 +1,7 @@
 #include "app/category_file.h"
 
 #include "app/existence.h"
+#include "app/names.h"
 #include "app/text_file.h"
 
 namespace fs = std::filesystem;
@@ -42,7 +43,7 @@ std::string DefaultCategoryText() {
   return text;
 }
 
-fs::path CategoryPath(const fs::path &libDir) { return libDir / "zep.ini"; }
+fs::path CategoryPath(const fs::path &libDir) { return FindAnyCase(libDir, "zep.ini"); }
 
 void EnsureCategoryFile(const fs::path &libDir, Failures &failures) {
   FileCheck(CategoryPath(libDir));

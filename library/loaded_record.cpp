@@ -1,11 +1,14 @@
 #include "library/loaded_record.h"
 
 #include "app/existence.h"
+#include "app/names.h"
 #include "app/text_file.h"
 
 namespace fs = std::filesystem;
 
-fs::path RecordPath(const AppState &state) { return state.LibDir / "FoldersLoaded.txt"; }
+fs::path RecordPath(const AppState &state) {
+  return FindAnyCase(state.LibDir, "FoldersLoaded.txt");
+}
 
 std::string RecordText(const FolderGrid &grid) {
   std::string text;

@@ -1,6 +1,7 @@
 #include "app/category_file.h"
 #include "app/startup.h"
 #include "app/text_file.h"
+#include "library/listing.h"
 #include "library/loaded_record.h"
 #include "library/record_replay.h"
 #include "tests/recording_caption.h"
@@ -126,4 +127,20 @@ TEST(LibraryModel, GridHeightStopsAtTwentyRows) {
   EXPECT_EQ(GridHeightTwips(1), 240 + 72);
   EXPECT_EQ(GridHeightTwips(19), 19 * 240 + 72);
   EXPECT_EQ(GridHeightTwips(5000), 20 * 240 + 72);
+}
+
+TEST(LibraryModel, LibraryFilesAreFoundWhateverTheirCase) {
+  TestFolder game;
+  game.Write("zep128/ZEP.INI", "Skins: S\r\n");
+  game.Write("zep128/foldersloaded.TXT", "S-a\r\n");
+  game.MakeFolder("zep128/S-a");
+  Failures failures;
+  AppState state = PreparedState(game, failures);
+  EnsureRecord(state, failures);
+  RecordingCaption caption;
+  ReplayRecord(state, caption, failures);
+  EXPECT_EQ(state.List3.size(), 3u);
+  EXPECT_EQ(state.Unigrid.rows[1].mark, "S");
+  EXPECT_EQ(ListFiles(game.Path() / "zep128"), (Lines{"foldersloaded.TXT", "ZEP.INI"}));
+  EXPECT_EQ(ListFolders(game.Path()).size(), 1u);
 }
