@@ -1,6 +1,8 @@
 #include "tests/test_folder.h"
 #include "tests/window_driver.h"
 
+#include <QApplication>
+#include <QMessageBox>
 #include <QTableWidget>
 #include <QTest>
 #include <gtest/gtest.h>
@@ -163,4 +165,23 @@ TEST(GridClickWindow, ACopyThatFailsIsSkippedAndToldOnce) {
   ASSERT_EQ(messages.size(), 1);
   EXPECT_TRUE(messages[0].contains("b.dat"));
   EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "Q-Mix\r\n\r\n");
+}
+
+TEST(GridClickWindow, ManyFailuresShowTheFirstFewAndKeepTheRestInTheDetails) {
+  TestFolder game;
+  MakeGame(game, "Singles: Q\r\n");
+  for (int i = 10; i < 30; ++i) {
+    const std::string name = "f" + std::to_string(i) + ".dat";
+    game.Write("ZEP128/Q-Big/" + name);
+    game.MakeFolder(name + "/in-the-way");
+  }
+  WindowDriver driver(game.Path());
+  driver.ClickRow(1);
+  QApplication::processEvents();
+  const QList<QMessageBox *> boxes = driver.Window().findChildren<QMessageBox *>();
+  ASSERT_EQ(boxes.size(), 1);
+  EXPECT_TRUE(boxes[0]->text().contains("f21.dat"));
+  EXPECT_FALSE(boxes[0]->text().contains("f22.dat"));
+  EXPECT_TRUE(boxes[0]->text().endsWith("... and 8 more."));
+  EXPECT_TRUE(boxes[0]->detailedText().contains("f29.dat"));
 }

@@ -322,9 +322,19 @@ void MainWindow::ShowPicture(QLabel *label, const fs::path &picture) {
 void MainWindow::Tell(const Failures &failures, const QString &heading) {
   if (failures.Empty())
     return;
-  auto *box =
-      new QMessageBox(QMessageBox::Warning, WindowCaptionText().simplified(),
-                      FromName(failures.Message(heading.toStdString())), QMessageBox::Ok, this);
+  // A disk that fails half-way through a big folder names every file; the box shows the first
+  // few and keeps the whole list under "Show Details".
+  constexpr int kShownLines = 12;
+  const std::vector<std::string> &lines = failures.Lines();
+  QString text = heading;
+  for (size_t i = 0; i < lines.size() && i < kShownLines; ++i)
+    text += "\n" + FromName(lines[i]);
+  auto *box = new QMessageBox(QMessageBox::Warning, WindowCaptionText().simplified(), text,
+                              QMessageBox::Ok, this);
+  if (lines.size() > kShownLines) {
+    box->setText(text + QString("\n... and %1 more.").arg(lines.size() - kShownLines));
+    box->setDetailedText(FromName(failures.Message(heading.toStdString())));
+  }
   box->setAttribute(Qt::WA_DeleteOnClose);
   box->open();
 }
