@@ -1,8 +1,9 @@
 #include "app/category_file.h"
 
-#include "app/existence.h"
-#include "app/names.h"
-#include "app/text_file.h"
+#include "base/existence.h"
+#include "base/file_ops.h"
+#include "base/names.h"
+#include "base/text_file.h"
 
 namespace fs = std::filesystem;
 
@@ -77,6 +78,11 @@ std::string SkippedLinesMessage(const std::vector<SkippedLine> &skipped) {
   for (const SkippedLine &line : skipped)
     text += "\nline " + std::to_string(line.number) + ": " + line.text;
   return text;
+}
+
+Categories LibraryCategories(const fs::path &libDir, Failures &failures) {
+  FileCheck(CategoryPath(libDir));
+  return FileFound ? ReadCategories(libDir, failures) : DefaultCategories();
 }
 
 Categories DefaultCategories() { return ParseCategories(SplitLines(DefaultCategoryText())); }

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "app/failures.h"
+#include "base/failures.h"
 
 #include <filesystem>
 #include <string>
@@ -34,5 +34,8 @@ Categories ParseCategories(const std::vector<std::string> &lines);
 Categories DefaultCategories();
 // Reads the category file; an unreadable file gives no categories.
 Categories ReadCategories(const std::filesystem::path &libDir, Failures &failures);
+// The categories of the library: those of its category file, or the default ones when the file
+// is missing (it could not be written).
+Categories LibraryCategories(const std::filesystem::path &libDir, Failures &failures);
 // The message that names the skipped lines.
 std::string SkippedLinesMessage(const std::vector<SkippedLine> &skipped);

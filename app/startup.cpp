@@ -1,15 +1,15 @@
 #include "app/startup.h"
 
-#include "app/existence.h"
+#include "base/existence.h"
+#include "base/listing.h"
+#include "base/names.h"
 #include "library/grid_builder.h"
-#include "library/listing.h"
 
-#include <algorithm>
 #include <system_error>
 
 namespace fs = std::filesystem;
 
-std::vector<SkippedLine> PrepareLibrary(AppState &state, Failures &failures) {
+std::vector<SkippedLine> PrepareLibrary(SelectorState &state, Failures &failures) {
   FolderCheck(state.LibDir);
   if (!FolderFound) {
     std::error_code error;
@@ -19,19 +19,20 @@ std::vector<SkippedLine> PrepareLibrary(AppState &state, Failures &failures) {
   }
   state.List3 = {"Show ALL", "Show Selections"};
   EnsureCategoryFile(state.LibDir, failures);
-  FileCheck(CategoryPath(state.LibDir));
-  Categories categories = FileFound ? ReadCategories(state.LibDir, failures) : DefaultCategories();
+  Categories categories = LibraryCategories(state.LibDir, failures);
   state.List3.insert(state.List3.end(), categories.descriptions.begin(),
                      categories.descriptions.end());
   state.Codes = std::move(categories.codes);
   return std::move(categories.skipped);
 }
 
-void BuildGrid(AppState &state, Failures &failures) {
-  FileCheck(CategoryPath(state.LibDir));
-  const Categories categories =
-      FileFound ? ReadCategories(state.LibDir, failures) : DefaultCategories();
+void BuildGrid(LibraryState &state, Failures &failures) {
+  const Categories categories = LibraryCategories(state.LibDir, failures);
   BuildFolderRows(state.Unigrid, categories.codes, ListFolders(state.LibDir));
 }
 
-int GridHeightTwips(int rowCount) { return kRowHeight * std::min(rowCount, 20) + 72; }
+fs::path GamePicture(const fs::path &eawDir, const char *name) {
+  const fs::path picture = FindAnyCase(eawDir, name);
+  FileCheck(picture);
+  return FileFound ? picture : fs::path();
+}

@@ -1,9 +1,9 @@
 // Times MoveIn and MoveOut against plain std::filesystem copies and removals of the same files
 // and prints how many times slower the program's own operations are.
 
-#include "app/app_state.h"
-#include "app/caption.h"
-#include "app/failures.h"
+#include "base/caption.h"
+#include "base/failures.h"
+#include "library/library_state.h"
 #include "library/move_in.h"
 #include "library/move_out.h"
 
@@ -101,8 +101,8 @@ void Loaded(const Workload &work) {
   ::sync();
 }
 
-AppState ReadyState(const Workload &work) {
-  AppState state = StateFor(work.game);
+LibraryState ReadyState(const Workload &work) {
+  LibraryState state = LibraryFor(work.game);
   state.Ready = true;
   return state;
 }
@@ -117,7 +117,7 @@ void BenchPlainCopy(benchmark::State &bench, const Workload *work) {
 }
 
 void BenchMoveIn(benchmark::State &bench, const Workload *work) {
-  AppState state = ReadyState(*work);
+  LibraryState state = ReadyState(*work);
   StoredCaption caption;
   Failures failures;
   for (auto _ : bench) {
@@ -140,7 +140,7 @@ void BenchPlainRemoval(benchmark::State &bench, const Workload *work) {
 }
 
 void BenchMoveOut(benchmark::State &bench, const Workload *work) {
-  AppState state = ReadyState(*work);
+  LibraryState state = ReadyState(*work);
   StoredCaption caption;
   Failures failures;
   for (auto _ : bench) {

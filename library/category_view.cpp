@@ -3,11 +3,6 @@
 #include <cstddef>
 #include <string_view>
 
-static bool AllowsMultipleSelections(std::string_view letter) {
-  return letter == "G" || letter == "N" || letter == "X" || letter == "Y" || letter == "Z" ||
-         letter == "K";
-}
-
 // The letter followed by "-" or a blank, compared case-sensitively.
 static bool InCategory(std::string_view name, std::string_view letter) {
   const size_t n = letter.size();
@@ -23,24 +18,23 @@ static void ShowAll(FolderGrid &grid) {
 // Shows the loaded rows only; the current cell ends on the last of them.
 static void ShowSelections(FolderGrid &grid) {
   for (size_t row = 1; row < grid.rows.size(); ++row) {
-    const bool loaded = grid.rows[row].mark == "S";
+    const bool loaded = IsLoaded(grid.rows[row]);
     grid.rows[row].height = loaded ? kRowHeight : 0;
     if (loaded)
       grid.ColourRow(static_cast<int>(row), kLoadedColour);
   }
 }
 
-static void ShowCategory(FolderGrid &grid, const std::string &letter) {
+static void ShowLetter(FolderGrid &grid, const std::string &letter) {
   for (size_t row = 1; row < grid.rows.size(); ++row)
     grid.rows[row].height = InCategory(grid.rows[row].name, letter) ? kRowHeight : 0;
-  grid.rows[0].name =
-      AllowsMultipleSelections(letter) ? kMultipleSelectionText : kSingleSelectionText;
+  const bool several = letter.size() == 1 && AllowsSeveralLoaded(letter[0]);
+  grid.rows[0].name = several ? kMultipleSelectionText : kSingleSelectionText;
 }
 
-std::string List3Click(AppState &state, int k) {
+std::string ShowCategory(FolderGrid &grid, const std::vector<std::string> &codes, int k) {
   if (k < 0)
     return "";
-  FolderGrid &grid = state.Unigrid;
   grid.rows[0].name = kAllFoldersText;
   if (k == 0) {
     ShowAll(grid);
@@ -52,7 +46,7 @@ std::string List3Click(AppState &state, int k) {
   }
   // An entry past the known categories has no letter, so it shows no folder.
   const size_t index = static_cast<size_t>(k - 2);
-  const std::string letter = index < state.Codes.size() ? state.Codes[index] : "";
-  ShowCategory(grid, letter);
+  const std::string letter = index < codes.size() ? codes[index] : "";
+  ShowLetter(grid, letter);
   return letter;
 }

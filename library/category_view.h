@@ -1,15 +1,16 @@
 #pragma once
 
-#include "app/app_state.h"
+#include "library/folder_grid.h"
 
 #include <string>
+#include <vector>
 
 // Header texts of the folder grid, one per kind of view.
 inline constexpr char kAllFoldersText[] = "All folders are available";
 inline constexpr char kSingleSelectionText[] = "Only one selection can be made!";
 inline constexpr char kMultipleSelectionText[] = "Multiple selections are allowed!";
 
-// A click on category list entry `k` (0 "Show ALL", 1 "Show Selections", then the categories):
-// shows and hides folder rows by height in one pass and sets the header text. Returns the text
-// for the code-letter label. A negative `k` (no entry) changes nothing.
-std::string List3Click(AppState &state, int k);
+// Shows category list entry `k` (0 "Show ALL", 1 "Show Selections", then the categories whose
+// letters are `codes`): shows and hides folder rows by height in one pass and sets the header
+// text. Returns the text for the code-letter label. A negative `k` (no entry) changes nothing.
+std::string ShowCategory(FolderGrid &grid, const std::vector<std::string> &codes, int k);

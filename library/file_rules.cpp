@@ -1,6 +1,6 @@
 #include "library/file_rules.h"
 
-#include "app/names.h"
+#include "base/names.h"
 
 #include <string>
 

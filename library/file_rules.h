@@ -1,9 +1,12 @@
 #pragma once
 
+#include <cstddef>
 #include <string_view>
 
 // Where loading puts a file of an add-on folder.
 enum class Place { Game, Savedata, Music };
+// How many places there are.
+inline constexpr size_t kPlaceCount = static_cast<size_t>(Place::Music) + 1;
 
 // Whether a file stays in the library when its folder is loaded (descriptions and pictures).
 bool StaysInLibrary(std::string_view name);

@@ -1,9 +1,15 @@
 #include "library/folder_grid.h"
 
+#include <string_view>
+
+bool AllowsSeveralLoaded(char letter) {
+  return letter != '\0' && std::string_view("GNXYZK").find(letter) != std::string_view::npos;
+}
+
 void FolderGrid::ColourRow(int row, std::uint32_t colour) {
   currentRow = row;
   currentCol = 1;
-  rows[static_cast<size_t>(row)].nameColour = colour;
+  Row(row).nameColour = colour;
 }
 
 void FolderGrid::ClearFolders() {

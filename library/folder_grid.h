@@ -9,6 +9,13 @@
 inline constexpr std::uint32_t kLoadedColour = 12648384;
 // Height in twips of a shown row; a hidden row has height 0.
 inline constexpr int kRowHeight = 240;
+// The text of column 2 that marks a row as loaded.
+inline constexpr char kLoadedMark[] = "S";
+
+// The grid's height in twips for `rowCount` rows: 20 rows at most, plus 72.
+inline int GridHeightTwips(int rowCount) {
+  return kRowHeight * (rowCount < 20 ? rowCount : 20) + 72;
+}
 
 // One row of the folder grid: column 0 the path, column 1 the name, column 2 the mark.
 struct GridRow {
@@ -19,6 +26,13 @@ struct GridRow {
   int height = kRowHeight;
 };
 
+// Whether the row's folder is loaded.
+inline bool IsLoaded(const GridRow &row) { return row.mark == kLoadedMark; }
+// The category letter of a row: the first character of its name, '\0' for none.
+inline char Letter(const GridRow &row) { return row.name.empty() ? '\0' : row.name.front(); }
+// Whether a category letter allows several loaded folders at once.
+bool AllowsSeveralLoaded(char letter);
+
 // The folder grid `Unigrid`: row 0 is the header row, whose name cell carries the rule text.
 struct FolderGrid {
   std::vector<GridRow> rows{GridRow{}};
@@ -26,6 +40,10 @@ struct FolderGrid {
   int currentCol = 1;
 
   int RowCount() const { return static_cast<int>(rows.size()); }
+  GridRow &Row(int row) { return rows[static_cast<size_t>(row)]; }
+  const GridRow &Row(int row) const { return rows[static_cast<size_t>(row)]; }
+  // Whether `row` is a folder row (not the header row, not past the end).
+  bool IsFolderRow(int row) const { return row >= 1 && row < RowCount(); }
   // Makes (row, column 1) the current cell and gives it `colour`.
   void ColourRow(int row, std::uint32_t colour);
   // Drops every folder row; the header row stays.

@@ -1,6 +1,6 @@
 #include "library/game_places.h"
 
-#include "app/names.h"
+#include "base/names.h"
 
 #include <system_error>
 

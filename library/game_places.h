@@ -1,8 +1,8 @@
 #pragma once
 
-#include "app/failures.h"
+#include "base/failures.h"
+#include "base/name_index.h"
 #include "library/file_rules.h"
-#include "library/name_index.h"
 
 #include <array>
 #include <filesystem>
@@ -36,5 +36,5 @@ private:
   Entry &At(Place place) { return entries_[static_cast<size_t>(place)]; }
 
   std::filesystem::path eawDir_;
-  std::array<Entry, 3> entries_;
+  std::array<Entry, kPlaceCount> entries_;
 };

@@ -1,6 +1,6 @@
 #include "library/grid_builder.h"
 
-#include "app/names.h"
+#include "base/names.h"
 
 #include <map>
 

@@ -1,12 +1,13 @@
 #include "library/loaded_record.h"
 
-#include "app/existence.h"
-#include "app/names.h"
-#include "app/text_file.h"
+#include "base/existence.h"
+#include "base/file_ops.h"
+#include "base/names.h"
+#include "base/text_file.h"
 
 namespace fs = std::filesystem;
 
-fs::path RecordPath(const AppState &state) {
+fs::path RecordPath(const LibraryState &state) {
   return FindAnyCase(state.LibDir, "FoldersLoaded.txt");
 }
 
@@ -14,26 +15,22 @@ std::string RecordText(const FolderGrid &grid) {
   std::string text;
   for (int row = 1; row < grid.RowCount(); ++row) {
     const GridRow &r = grid.rows[static_cast<size_t>(row)];
-    if (r.mark == "S")
+    if (IsLoaded(r))
       text += r.name + "\r\n";
   }
   return text + "\r\n";
 }
 
-void SaveLoaded(AppState &state, Failures &failures) {
+void SaveLoaded(LibraryState &state, Failures &failures) {
   if (!state.Ready)
     return;
-  state.Ready = false;
+  const ReadyGuard writing(state, false);
   WriteAtomically(RecordPath(state), RecordText(state.Unigrid), failures);
-  state.Ready = true;
 }
 
-std::vector<std::string> ReadLoadedNames(const AppState &state, Failures &failures) {
+std::vector<std::string> ReadLoadedNames(const LibraryState &state, Failures &failures) {
   std::vector<std::string> names;
-  FileCheck(RecordPath(state));
-  if (!FileFound)
-    return names;
-  if (auto lines = ReadLines(RecordPath(state), failures)) {
+  if (auto lines = ReadLinesIfExists(RecordPath(state), failures)) {
     for (std::string &line : *lines)
       if (!line.empty())
         names.push_back(std::move(line));
@@ -41,7 +38,7 @@ std::vector<std::string> ReadLoadedNames(const AppState &state, Failures &failur
   return names;
 }
 
-void EnsureRecord(const AppState &state, Failures &failures) {
+void EnsureRecord(const LibraryState &state, Failures &failures) {
   FileCheck(RecordPath(state));
   if (!FileFound)
     WriteAtomically(RecordPath(state), "", failures);

@@ -1,19 +1,19 @@
 #pragma once
 
-#include "app/app_state.h"
-#include "app/failures.h"
+#include "base/failures.h"
+#include "library/library_state.h"
 
 #include <filesystem>
 #include <string>
 #include <vector>
 
 // The loaded-folders record "FoldersLoaded.txt" in the library.
-std::filesystem::path RecordPath(const AppState &state);
+std::filesystem::path RecordPath(const LibraryState &state);
 // The record's bytes for the grid: each loaded name and CR LF, then one more CR LF.
 std::string RecordText(const FolderGrid &grid);
 // Rewrites the record from the grid's marks, atomically; does nothing while `Ready` is false.
-void SaveLoaded(AppState &state, Failures &failures);
+void SaveLoaded(LibraryState &state, Failures &failures);
 // The record's non-empty lines; a missing or unreadable record gives none.
-std::vector<std::string> ReadLoadedNames(const AppState &state, Failures &failures);
+std::vector<std::string> ReadLoadedNames(const LibraryState &state, Failures &failures);
 // Creates the record as an empty file when it is missing.
-void EnsureRecord(const AppState &state, Failures &failures);
+void EnsureRecord(const LibraryState &state, Failures &failures);

@@ -1,14 +1,15 @@
 #include "library/move_in.h"
 
-#include "app/names.h"
+#include "base/file_ops.h"
+#include "base/listing.h"
+#include "base/names.h"
 #include "library/file_rules.h"
 #include "library/game_places.h"
-#include "library/listing.h"
-#include "library/safe_copy.h"
 
 namespace fs = std::filesystem;
 
-void MoveIn(const AppState &state, const fs::path &folder, Caption &caption, Failures &failures) {
+void MoveIn(const LibraryState &state, const fs::path &folder, Caption &caption,
+            Failures &failures) {
   if (!state.Ready || folder == state.EAWDir)
     return;
   CaptionRestorer restorer(caption);

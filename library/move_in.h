@@ -1,8 +1,8 @@
 #pragma once
 
-#include "app/app_state.h"
-#include "app/caption.h"
-#include "app/failures.h"
+#include "base/caption.h"
+#include "base/failures.h"
+#include "library/library_state.h"
 
 #include <filesystem>
 
@@ -10,5 +10,5 @@
 // the game folder, "Savedata" or "Music", replacing a file of that name, and shows each copied
 // name in the caption. Does nothing while `Ready` is false or when `folder` is the game folder.
 // A file that cannot be copied is skipped and recorded in `failures`.
-void MoveIn(const AppState &state, const std::filesystem::path &folder, Caption &caption,
+void MoveIn(const LibraryState &state, const std::filesystem::path &folder, Caption &caption,
             Failures &failures);

@@ -1,13 +1,12 @@
 #include "library/move_out.h"
 
-#include "app/names.h"
+#include "base/file_ops.h"
+#include "base/listing.h"
+#include "base/names.h"
 #include "library/file_rules.h"
 #include "library/game_places.h"
-#include "library/listing.h"
 #include "library/loaded_record.h"
 #include "library/save_files.h"
-
-#include <system_error>
 
 namespace fs = std::filesystem;
 
@@ -27,16 +26,12 @@ static void DeleteCopies(const fs::path &eawDir, const fs::path &folder, Caption
     const std::string found = matches.front();
     const fs::path target = Child(places.Folder(place), found);
     caption.Set("Deleting " + found);
-    std::error_code error;
-    fs::remove(target, error);
-    if (error)
-      failures.Add(target, "cannot be deleted (" + error.message() + ")");
-    else
+    if (RemoveFile(target, failures))
       index.Remove(found);
   }
 }
 
-void MoveOut(AppState &state, const fs::path &folder, Caption &caption, Failures &failures) {
+void MoveOut(LibraryState &state, const fs::path &folder, Caption &caption, Failures &failures) {
   if (!state.Ready)
     return;
   if (IsCampaignPath(folder))
@@ -47,13 +42,12 @@ void MoveOut(AppState &state, const fs::path &folder, Caption &caption, Failures
   SaveLoaded(state, failures);
 }
 
-void Udel(AppState &state, Caption &caption, Failures &failures) {
+void Udel(LibraryState &state, int row, Caption &caption, Failures &failures) {
   FolderGrid &grid = state.Unigrid;
-  if (state.ClickedRow < 1 || state.ClickedRow >= grid.RowCount())
+  if (!grid.IsFolderRow(row))
     return;
-  GridRow &row = grid.rows[static_cast<size_t>(state.ClickedRow)];
-  row.mark.clear();
-  grid.ColourRow(state.ClickedRow, state.GridBackColor);
-  const fs::path folder = row.path;
+  grid.Row(row).mark.clear();
+  grid.ColourRow(row, state.GridBackColor);
+  const fs::path folder = grid.Row(row).path;
   MoveOut(state, folder, caption, failures);
 }

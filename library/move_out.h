@@ -1,8 +1,8 @@
 #pragma once
 
-#include "app/app_state.h"
-#include "app/caption.h"
-#include "app/failures.h"
+#include "base/caption.h"
+#include "base/failures.h"
+#include "library/library_state.h"
 
 #include <filesystem>
 
@@ -11,7 +11,7 @@
 // exactly one file there has its name in any case, showing "Deleting NAME" in the caption; then
 // rewrites the record. Does nothing while `Ready` is false, so that replaying the record never
 // touches a file. A file that cannot be deleted is skipped and recorded in `failures`.
-void MoveOut(AppState &state, const std::filesystem::path &folder, Caption &caption,
+void MoveOut(LibraryState &state, const std::filesystem::path &folder, Caption &caption,
              Failures &failures);
-// Unloads the folder of row `ClickedRow`: clears its mark, colours it `GridBackColor`, MoveOut.
-void Udel(AppState &state, Caption &caption, Failures &failures);
+// Unloads the folder of grid row `row`: clears its mark, colours it `GridBackColor`, MoveOut.
+void Udel(LibraryState &state, int row, Caption &caption, Failures &failures);

@@ -1,18 +1,11 @@
 #include "library/preview.h"
 
-#include "app/failures.h"
-#include "app/names.h"
-#include "app/text_file.h"
-#include "library/listing.h"
+#include "base/failures.h"
+#include "base/listing.h"
+#include "base/names.h"
+#include "base/text_file.h"
 
 namespace fs = std::filesystem;
-
-bool EnterHoverRow(AppState &state, int row) {
-  if (row == state.HoverRow)
-    return false;
-  state.HoverRow = row;
-  return true;
-}
 
 static std::string Description(const fs::path &file) {
   // A description is a courtesy: one that cannot be read just leaves the preview empty.
@@ -37,7 +30,7 @@ FolderPreview PreviewOf(const fs::path &folder) {
   return preview;
 }
 
-FolderPreview PreviewOfRow(const AppState &state, int row) {
+FolderPreview PreviewOfRow(const LibraryState &state, int row) {
   if (row < 1 || row >= state.Unigrid.RowCount())
     return {};
   return PreviewOf(state.Unigrid.rows[static_cast<size_t>(row)].path);

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "app/app_state.h"
+#include "library/library_state.h"
 
 #include <filesystem>
 #include <string>
@@ -14,11 +14,8 @@ struct FolderPreview {
 // The pattern list of the files that can be a folder's picture, in the order they are looked for.
 inline constexpr char kPicturePatterns[] = "mypic;skinpic;*.jpg;*.bmp;*.gif";
 
-// Records that the pointer is over grid row `row`; true when that is another row than before, so
-// that the preview is to be rebuilt.
-bool EnterHoverRow(AppState &state, int row);
 // The preview of add-on folder `folder`. A missing folder, or a contents.txt that cannot be read,
 // gives an empty description and no picture.
 FolderPreview PreviewOf(const std::filesystem::path &folder);
 // The preview of grid row `row`; the header row and rows outside the grid give an empty preview.
-FolderPreview PreviewOfRow(const AppState &state, int row);
+FolderPreview PreviewOfRow(const LibraryState &state, int row);

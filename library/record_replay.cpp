@@ -7,14 +7,13 @@
 #include <unordered_map>
 #include <vector>
 
-void ReplayRecord(AppState &state, Caption &caption, Failures &failures) {
-  const bool wasReady = state.Ready;
-  state.Ready = false;
+void ReplayRecord(LibraryState &state, Caption &caption, Failures &failures) {
+  const ReadyGuard replaying(state, false);
   FolderGrid &grid = state.Unigrid;
   // Index the rows by name once, so that a long record costs no more than the grid itself.
   std::unordered_multimap<std::string, int> rowsByName;
   for (int row = 1; row < grid.RowCount(); ++row)
-    rowsByName.emplace(grid.rows[static_cast<size_t>(row)].name, row);
+    rowsByName.emplace(grid.Row(row).name, row);
   for (const std::string &name : ReadLoadedNames(state, failures)) {
     auto [first, last] = rowsByName.equal_range(name);
     std::vector<int> rows;
@@ -22,10 +21,9 @@ void ReplayRecord(AppState &state, Caption &caption, Failures &failures) {
       rows.push_back(it->second);
     std::sort(rows.begin(), rows.end());
     for (int row : rows) {
-      grid.rows[static_cast<size_t>(row)].mark.clear();
+      grid.Row(row).mark.clear();
       grid.ColourRow(row, kLoadedColour);
-      UnigridClick(state, caption, failures);
+      ClickRow(state, row, caption, failures);
     }
   }
-  state.Ready = wasReady;
 }

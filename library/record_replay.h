@@ -1,9 +1,9 @@
 #pragma once
 
-#include "app/app_state.h"
-#include "app/caption.h"
-#include "app/failures.h"
+#include "base/caption.h"
+#include "base/failures.h"
+#include "library/library_state.h"
 
 // Marks the rows named in the loaded-folders record as loaded, through the grid click with
 // `Ready` false, so that no file is touched.
-void ReplayRecord(AppState &state, Caption &caption, Failures &failures);
+void ReplayRecord(LibraryState &state, Caption &caption, Failures &failures);

@@ -1,12 +1,10 @@
 #include "library/reset_all.h"
 
-#include "app/existence.h"
-#include "app/names.h"
-#include "app/text_file.h"
-#include "library/listing.h"
+#include "base/file_ops.h"
+#include "base/listing.h"
+#include "base/names.h"
+#include "base/text_file.h"
 #include "library/loaded_record.h"
-
-#include <system_error>
 
 namespace fs = std::filesystem;
 
@@ -22,18 +20,14 @@ static bool IsProtected(const std::string &name) {
 }
 
 std::string CleanUpPatterns(const fs::path &libDir, Failures &failures) {
-  const fs::path file = FindAnyCase(libDir, "CleanUp.ini");
-  FileCheck(file);
-  if (!FileFound)
-    return kDefaultCleanUpPatterns;
   // An empty list would delete nothing and a blank one is surely a slip: keep the default.
-  const auto lines = ReadLines(file, failures);
+  const auto lines = ReadLinesIfExists(FindAnyCase(libDir, "CleanUp.ini"), failures);
   if (!lines || lines->empty() || IsBlank(lines->front()))
     return kDefaultCleanUpPatterns;
   return lines->front();
 }
 
-std::vector<std::string> CleanUpNames(const AppState &state, Failures &failures) {
+std::vector<std::string> CleanUpNames(const LibraryState &state, Failures &failures) {
   std::vector<std::string> names;
   for (std::string &name : ListFiles(state.EAWDir, CleanUpPatterns(state.LibDir, failures)))
     if (!IsProtected(name))
@@ -43,21 +37,16 @@ std::vector<std::string> CleanUpNames(const AppState &state, Failures &failures)
 
 void DeleteFiles(const fs::path &folder, const std::vector<std::string> &names,
                  Failures &failures) {
-  for (const std::string &name : names) {
-    const fs::path file = Child(folder, name);
-    std::error_code error;
-    fs::remove(file, error);
-    if (error)
-      failures.Add(file, "cannot be deleted (" + error.message() + ")");
-  }
+  for (const std::string &name : names)
+    RemoveFile(Child(folder, name), failures);
 }
 
-void CleanUp(const AppState &state, Failures &failures) {
+void CleanUp(const LibraryState &state, Failures &failures) {
   DeleteFiles(state.EAWDir, CleanUpNames(state, failures), failures);
 }
 
 // The record is now empty, so no row may stay marked: a later click would write it back.
-static void UnmarkAllRows(AppState &state) {
+static void UnmarkAllRows(LibraryState &state) {
   for (size_t row = 1; row < state.Unigrid.rows.size(); ++row) {
     state.Unigrid.rows[row].mark.clear();
     state.Unigrid.rows[row].nameColour = state.GridBackColor;
@@ -65,7 +54,7 @@ static void UnmarkAllRows(AppState &state) {
   state.Slots.frameVisible = false;
 }
 
-void Command1Click(AppState &state, Caption &caption, Failures &failures) {
+void ResetAll(LibraryState &state, Caption &caption, Failures &failures) {
   {
     CaptionRestorer restorer(caption);
     state.Ready = true;

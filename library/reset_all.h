@@ -1,8 +1,8 @@
 #pragma once
 
-#include "app/app_state.h"
-#include "app/caption.h"
-#include "app/failures.h"
+#include "base/caption.h"
+#include "base/failures.h"
+#include "library/library_state.h"
 
 #include <filesystem>
 #include <string>
@@ -19,11 +19,11 @@ inline constexpr char kDefaultCleanUpPatterns[] =
 std::string CleanUpPatterns(const std::filesystem::path &libDir, Failures &failures);
 // The plain files directly in the game folder that Reset All deletes, in name order: those that
 // match the pattern list, except the names the game itself keeps there.
-std::vector<std::string> CleanUpNames(const AppState &state, Failures &failures);
+std::vector<std::string> CleanUpNames(const LibraryState &state, Failures &failures);
 // Deletes each named file of `folder`; one that cannot be deleted is skipped and recorded.
 void DeleteFiles(const std::filesystem::path &folder, const std::vector<std::string> &names,
                  Failures &failures);
 // Deletes the add-on files from the game folder.
-void CleanUp(const AppState &state, Failures &failures);
+void CleanUp(const LibraryState &state, Failures &failures);
 // "Reset All": cleans up the game folder, empties the record and shows every row unloaded.
-void Command1Click(AppState &state, Caption &caption, Failures &failures);
+void ResetAll(LibraryState &state, Caption &caption, Failures &failures);

@@ -1,10 +1,10 @@
 #include "library/save_files.h"
 
-#include "app/names.h"
+#include "base/file_ops.h"
+#include "base/listing.h"
+#include "base/name_index.h"
+#include "base/names.h"
 #include "library/game_places.h"
-#include "library/listing.h"
-#include "library/name_index.h"
-#include "library/safe_copy.h"
 
 #include <system_error>
 

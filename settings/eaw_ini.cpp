@@ -1,11 +1,9 @@
 #include "settings/eaw_ini.h"
 
-#include "app/existence.h"
-#include "app/names.h"
-#include "app/text_file.h"
+#include "base/file_ops.h"
+#include "base/names.h"
+#include "base/text_file.h"
 #include "settings/loose_number.h"
-
-#include <system_error>
 
 namespace fs = std::filesystem;
 
@@ -13,11 +11,8 @@ fs::path IniPath(const fs::path &eawDir) { return FindAnyCase(eawDir, "eaw.ini")
 
 IniValues IniRead(const fs::path &eawDir, Failures &failures) {
   IniValues values;
-  const fs::path path = IniPath(eawDir);
-  FileCheck(path);
-  if (!FileFound)
-    return values;
-  const std::optional<std::vector<std::string>> lines = ReadLines(path, failures);
+  const std::optional<std::vector<std::string>> lines =
+      ReadLinesIfExists(IniPath(eawDir), failures);
   if (!lines)
     return values;
   for (const std::string &line : *lines)
@@ -45,24 +40,6 @@ void inisave(const fs::path &eawDir, bool ready, const IniTexts &texts, Failures
   if (!ready)
     return;
   const fs::path path = IniPath(eawDir);
-  FileCheck(path);
-  if (!FileFound)
-    return;
-  if (const std::optional<std::vector<std::string>> lines = ReadLines(path, failures))
-    ReplaceIni(path, RewrittenIni(*lines, texts), failures);
-}
-
-bool ReplaceIni(const fs::path &path, const std::string &bytes, Failures &failures) {
-  std::error_code error;
-  const fs::perms before = fs::status(path, error).permissions();
-  // Windows refuses to replace a read-only file.
-  if (!error)
-    fs::permissions(path, fs::perms::owner_write, fs::perm_options::add, error);
-  if (error) {
-    failures.Add(path, "cannot be made writable (" + error.message() + ")");
-    return false;
-  }
-  const bool written = WriteAtomically(path, bytes, failures);
-  fs::permissions(path, written ? before | fs::perms::owner_write : before, error);
-  return written;
+  if (const std::optional<std::vector<std::string>> lines = ReadLinesIfExists(path, failures))
+    WriteAtomically(path, RewrittenIni(*lines, texts), failures);
 }

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "app/failures.h"
+#include "base/failures.h"
 
 #include <array>
 #include <filesystem>
@@ -9,15 +9,17 @@
 #include <string_view>
 #include <vector>
 
-// The six settings keys, in the order in which they are read and written: the boxes Width,
-// Height, Extra Squads, Day, Month and Planeset.
-inline constexpr std::array<std::string_view, 6> kIniKeys = {
+// How many settings the boxes show.
+inline constexpr size_t kSettingCount = 6;
+// The settings keys, in the order in which they are read and written: the boxes Width, Height,
+// Extra Squads, Day, Month and Planeset.
+inline constexpr std::array<std::string_view, kSettingCount> kIniKeys = {
     "Width=", "Height=", "ExtraSquads=", "Day=", "Month=", "PlaneSetNumber="};
 
 // One text per key of kIniKeys, as the boxes hold them.
-using IniTexts = std::array<std::string, kIniKeys.size()>;
+using IniTexts = std::array<std::string, kSettingCount>;
 // One display text per key of kIniKeys; nothing where the key was not found.
-using IniValues = std::array<std::optional<std::string>, kIniKeys.size()>;
+using IniValues = std::array<std::optional<std::string>, kSettingCount>;
 
 // The game's settings file "eaw.ini" in `eawDir`, found whatever its letter case.
 std::filesystem::path IniPath(const std::filesystem::path &eawDir);
@@ -31,6 +33,3 @@ std::string RewrittenIni(const std::vector<std::string> &lines, const IniTexts &
 // false or when the file is missing; a read-only file is written and left writable.
 void inisave(const std::filesystem::path &eawDir, bool ready, const IniTexts &texts,
              Failures &failures);
-// Replaces the settings file at `path` by `bytes` atomically, keeping its permissions and making
-// it writable. On failure the file is left as it was and false is returned, with the reason.
-bool ReplaceIni(const std::filesystem::path &path, const std::string &bytes, Failures &failures);

@@ -1,7 +1,8 @@
 #include "settings/ini_editor.h"
 
-#include "app/existence.h"
-#include "app/text_file.h"
+#include "base/existence.h"
+#include "base/file_ops.h"
+#include "base/text_file.h"
 #include "settings/eaw_ini.h"
 
 #include <system_error>
@@ -9,11 +10,8 @@
 namespace fs = std::filesystem;
 
 std::string IniDisplayText(const fs::path &eawDir, Failures &failures) {
-  const fs::path path = IniPath(eawDir);
-  FileCheck(path);
-  if (!FileFound)
-    return "";
-  const std::optional<std::vector<std::string>> lines = ReadLines(path, failures);
+  const std::optional<std::vector<std::string>> lines =
+      ReadLinesIfExists(IniPath(eawDir), failures);
   return lines ? JoinCrLf(*lines) : "";
 }
 
@@ -47,5 +45,5 @@ bool IniEditorSave(const fs::path &eawDir, const std::string &text, Failures &fa
     failures.Add(path, "is read-only; it was not changed");
     return false;
   }
-  return ReplaceIni(path, WithCrLf(text) + "\r\n", failures);
+  return WriteAtomically(path, WithCrLf(text) + "\r\n", failures);
 }

@@ -1,9 +1,8 @@
 #include "settings/music_sets.h"
 
-#include "app/existence.h"
-#include "app/names.h"
-#include "app/text_file.h"
-#include "library/listing.h"
+#include "base/listing.h"
+#include "base/names.h"
+#include "base/text_file.h"
 
 #include <set>
 
@@ -24,11 +23,8 @@ static std::set<std::string> FolderNamesUpper(const fs::path &folder) {
 
 MusicList FillMusicList(const fs::path &eawDir, Failures &failures) {
   MusicList list;
-  const fs::path path = FindAnyCase(eawDir, "Music.ini");
-  FileCheck(path);
-  if (!FileFound)
-    return list;
-  const std::optional<std::vector<std::string>> lines = ReadLines(path, failures);
+  const std::optional<std::vector<std::string>> lines =
+      ReadLinesIfExists(FindAnyCase(eawDir, "Music.ini"), failures);
   if (!lines)
     return list;
   const std::set<std::string> folders = FolderNamesUpper(eawDir);

@@ -1,7 +1,7 @@
 #include "settings/music_switch.h"
 
-#include "app/existence.h"
-#include "app/names.h"
+#include "base/existence.h"
+#include "base/names.h"
 #include "settings/music_sets.h"
 
 #include <system_error>

@@ -1,8 +1,8 @@
 #include "slots/plane_set.h"
 
-#include "app/names.h"
-#include "app/text_file.h"
-#include "library/listing.h"
+#include "base/listing.h"
+#include "base/names.h"
+#include "base/text_file.h"
 #include "slots/leading_number.h"
 
 namespace fs = std::filesystem;

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "app/failures.h"
+#include "base/failures.h"
 #include "slots/slot_table.h"
 
 #include <filesystem>

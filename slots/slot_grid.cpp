@@ -1,13 +1,13 @@
 #include "slots/slot_grid.h"
 
-#include "app/names.h"
+#include "base/names.h"
 #include "slots/plane_set.h"
 
 namespace fs = std::filesystem;
 
-void GridSet(AppState &state, const fs::path &FMfolder, Failures &failures) {
-  SlotPanel &slots = state.Slots;
-  state.GridBackColor = slots.currentCellColour;
+void GridSet(SlotPanel &slots, std::uint32_t &GridBackColor, const fs::path &FMfolder,
+             Failures &failures) {
+  GridBackColor = slots.currentCellColour;
   const std::vector<fs::path> planeSets = PlaneSetFolders(FMfolder);
   if (planeSets.empty())
     return;

@@ -3,13 +3,13 @@
 #include <gtest/gtest.h>
 
 TEST(CategoryView, HeaderTellsWhetherSeveralMayBeLoaded) {
-  AppState state;
-  state.Codes = {"G", "N", "X", "Y", "Z", "K", "g", "S", "k"};
+  FolderGrid grid;
+  const std::vector<std::string> codes = {"G", "N", "X", "Y", "Z", "K", "g", "S", "k"};
   for (int k = 2; k < 11; ++k) {
-    List3Click(state, k);
-    EXPECT_EQ(state.Unigrid.rows[0].name, k < 8 ? kMultipleSelectionText : kSingleSelectionText)
-        << state.Codes[k - 2];
+    ShowCategory(grid, codes, k);
+    EXPECT_EQ(grid.rows[0].name, k < 8 ? kMultipleSelectionText : kSingleSelectionText)
+        << codes[k - 2];
   }
-  List3Click(state, 1);
-  EXPECT_EQ(state.Unigrid.rows[0].name, kAllFoldersText);
+  ShowCategory(grid, codes, 1);
+  EXPECT_EQ(grid.rows[0].name, kAllFoldersText);
 }

@@ -1,6 +1,6 @@
 #include "settings/eaw_ini.h"
 #include "settings/ini_editor.h"
-#include "tests/test_folder.h"
+#include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
 
@@ -20,7 +20,7 @@ Shown Read(const TestFolder &game) {
 } // namespace
 
 TEST(EawIni, ReadsAndWritesLinesEndedByLineFeedsAlone) {
-  TestFolder game;
+  GameFolder game;
   game.Write("eaw.ini", "Width=640\nHeight=480\nSound=1\n");
   EXPECT_EQ(Read(game)[1], "480");
   Failures failures;
@@ -29,7 +29,7 @@ TEST(EawIni, ReadsAndWritesLinesEndedByLineFeedsAlone) {
 }
 
 TEST(EawIni, WritesAReadOnlyFileButNeverDamagesIt) {
-  TestFolder game;
+  GameFolder game;
   Failures failures;
   inisave(game.Path(), true, kTexts, failures);
   EXPECT_FALSE(game.Exists("eaw.ini"));
@@ -48,7 +48,7 @@ TEST(EawIni, WritesAReadOnlyFileButNeverDamagesIt) {
 }
 
 TEST(IniEditor, ShowsTheFileAndSavesTheTextWithOneMoreLine) {
-  TestFolder game;
+  GameFolder game;
   Failures failures;
   EXPECT_EQ(IniDisplayText(game.Path(), failures), "");
   EXPECT_FALSE(IniEditorSave(game.Path(), "Width=1", failures));

@@ -1,4 +1,4 @@
-#include "tests/test_folder.h"
+#include "tests/game_folder.h"
 #include "tests/window_driver.h"
 
 #include <QApplication>
@@ -10,13 +10,6 @@
 namespace fs = std::filesystem;
 
 namespace {
-
-// A game folder with "Savedata", "Music" and a library of the given category lines.
-void MakeGame(const TestFolder &game, const std::string &categories) {
-  game.MakeFolder("Savedata");
-  game.MakeFolder("Music");
-  game.Write("ZEP128/zep.ini", categories);
-}
 
 QColor NameCellColour(WindowDriver &driver, int row) {
   return driver.Grid()->model()->index(row - 1, 1).data(Qt::BackgroundRole).value<QColor>();
@@ -31,8 +24,8 @@ const QColor kGreen(192, 255, 192);
 } // namespace
 
 TEST(GridClickWindow, LoadCopiesEachFileToItsPlaceAndUnloadDeletesTheCopies) {
-  TestFolder game;
-  MakeGame(game, "Singles: Q\r\n");
+  GameFolder game;
+  game.WithGameFolders().WithCategories("Singles: Q\r\n");
   const char *names[] = {"a.MSN",    "b.sve", "c.BGM", "d.txt", "mypic", "contents.txt",
                          "eca1.dat", "e.ldr", "f.jpg", "g.pcx", "h.gif", "i.bmp"};
   for (const char *name : names)
@@ -53,7 +46,7 @@ TEST(GridClickWindow, LoadCopiesEachFileToItsPlaceAndUnloadDeletesTheCopies) {
   EXPECT_TRUE(IsWritable(game.Path() / "ZEP128/Q-Mix/d.txt"));
   EXPECT_EQ(NameCellColour(driver, 1), kGreen);
   EXPECT_EQ(Mark(driver, 1), "S");
-  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "Q-Mix\r\n\r\n");
+  EXPECT_EQ(game.Record(), "Q-Mix\r\n\r\n");
   EXPECT_EQ(driver.Window().windowTitle(), caption);
 
   fs::remove(game.Path() / "i.bmp");
@@ -62,13 +55,13 @@ TEST(GridClickWindow, LoadCopiesEachFileToItsPlaceAndUnloadDeletesTheCopies) {
     EXPECT_FALSE(game.Exists(copy)) << copy;
   EXPECT_TRUE(game.Exists("Savedata/b.sve"));
   EXPECT_EQ(Mark(driver, 1), "");
-  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "\r\n");
+  EXPECT_EQ(game.Record(), "\r\n");
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 }
 
 TEST(GridClickWindow, SingleSelectionSwapsAndMultiSelectionKeepsBoth) {
-  TestFolder game;
-  MakeGame(game, "Skins: S\r\nSounds: N\r\n");
+  GameFolder game;
+  game.WithGameFolders().WithCategories("Skins: S\r\nSounds: N\r\n");
   game.Write("ZEP128/S-one/one.dat");
   game.Write("ZEP128/S-two/two.dat");
   game.Write("ZEP128/N-a/a.wav");
@@ -88,12 +81,12 @@ TEST(GridClickWindow, SingleSelectionSwapsAndMultiSelectionKeepsBoth) {
   driver.PressGridKey(Qt::Key_A);
   EXPECT_TRUE(game.Exists("a.wav"));
   EXPECT_TRUE(game.Exists("b.wav"));
-  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "S-two\r\nN-a\r\nN-b\r\n\r\n");
+  EXPECT_EQ(game.Record(), "S-two\r\nN-a\r\nN-b\r\n\r\n");
 }
 
 TEST(GridClickWindow, CampaignSwapCarriesEverySaveFileIntoTheOtherCampaign) {
-  TestFolder game;
-  MakeGame(game, "Campaigns: C\r\n");
+  GameFolder game;
+  game.WithGameFolders().WithCategories("Campaigns: C\r\n");
   game.Write("ZEP128/C first/first.msn");
   game.Write("ZEP128/C-second/second.msn");
   WindowDriver driver(game.Path());
@@ -106,16 +99,16 @@ TEST(GridClickWindow, CampaignSwapCarriesEverySaveFileIntoTheOtherCampaign) {
   EXPECT_FALSE(game.Exists("Savedata/pilot1.sve"));
   EXPECT_FALSE(game.Exists("Savedata/first.msn"));
   EXPECT_TRUE(game.Exists("Savedata/second.msn"));
-  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "C-second\r\n\r\n");
+  EXPECT_EQ(game.Record(), "C-second\r\n\r\n");
 }
 
 TEST(GridClickWindow, ReplayAtStartTouchesNoFile) {
-  TestFolder game;
-  MakeGame(game, "Skins: S\r\nSkins again: S\r\n");
+  GameFolder game;
+  game.WithGameFolders().WithCategories("Skins: S\r\nSkins again: S\r\n");
   game.Write("ZEP128/S-one/one.dat");
   game.Write("ZEP128/S-two/two.dat");
   game.Write("one.dat", "loaded earlier");
-  game.Write("ZEP128/FoldersLoaded.txt", "S-one\r\nS-two\r\n\r\n");
+  game.WithRecord("S-one\r\nS-two\r\n\r\n");
   WindowDriver driver(game.Path());
   EXPECT_EQ(game.Read("one.dat"), "loaded earlier");
   EXPECT_FALSE(game.Exists("two.dat"));
@@ -123,12 +116,12 @@ TEST(GridClickWindow, ReplayAtStartTouchesNoFile) {
   for (int row : {1, 2, 3})
     EXPECT_EQ(Mark(driver, row), "") << row;
   EXPECT_EQ(Mark(driver, 4), "S");
-  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "S-one\r\nS-two\r\n\r\n");
+  EXPECT_EQ(game.Record(), "S-one\r\nS-two\r\n\r\n");
 }
 
 TEST(GridClickWindow, FlightModelShowsItsPlaneSetsUntilUnloaded) {
-  TestFolder game;
-  MakeGame(game, "Flight models: F\r\n");
+  GameFolder game;
+  game.WithGameFolders().WithCategories("Flight models: F\r\n");
   std::string zep = "Lightning\r\n7 \r\n";
   for (int line = 3; line <= 165; ++line)
     zep += "0\r\n";
@@ -151,8 +144,8 @@ TEST(GridClickWindow, FlightModelShowsItsPlaneSetsUntilUnloaded) {
 }
 
 TEST(GridClickWindow, ACopyThatFailsIsSkippedAndToldOnce) {
-  TestFolder game;
-  MakeGame(game, "Singles: Q\r\n");
+  GameFolder game;
+  game.WithGameFolders().WithCategories("Singles: Q\r\n");
   for (const char *name : {"a.dat", "b.dat", "c.dat"})
     game.Write(std::string("ZEP128/Q-Mix/") + name, name);
   game.MakeFolder("b.dat/in-the-way");
@@ -164,12 +157,12 @@ TEST(GridClickWindow, ACopyThatFailsIsSkippedAndToldOnce) {
   const QStringList messages = driver.TakeMessages();
   ASSERT_EQ(messages.size(), 1);
   EXPECT_TRUE(messages[0].contains("b.dat"));
-  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "Q-Mix\r\n\r\n");
+  EXPECT_EQ(game.Record(), "Q-Mix\r\n\r\n");
 }
 
 TEST(GridClickWindow, ManyFailuresShowTheFirstFewAndKeepTheRestInTheDetails) {
-  TestFolder game;
-  MakeGame(game, "Singles: Q\r\n");
+  GameFolder game;
+  game.WithGameFolders().WithCategories("Singles: Q\r\n");
   for (int i = 10; i < 30; ++i) {
     const std::string name = "f" + std::to_string(i) + ".dat";
     game.Write("ZEP128/Q-Big/" + name);

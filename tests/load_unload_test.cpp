@@ -1,31 +1,26 @@
-#include "library/listing.h"
+#include "base/listing.h"
 #include "library/move_in.h"
 #include "library/move_out.h"
 #include "library/save_files.h"
-#include "tests/recording_caption.h"
-#include "tests/test_folder.h"
+#include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
-
-#include <algorithm>
 
 namespace fs = std::filesystem;
 
 namespace {
 
+// A game folder and a ready library state that loads and unloads its add-on folders.
 struct Game {
-  TestFolder folder;
-  AppState state = StateFor(folder.Path());
+  GameFolder folder;
+  LibraryState state = LibraryFor(folder.Path());
   RecordingCaption caption;
   Failures failures;
 
   Game() { state.Ready = true; }
-  fs::path Addon(const std::string &name) const { return folder.MakeFolder("ZEP128/" + name); }
-  void Load(const std::string &name) { MoveIn(state, Addon(name), caption, failures); }
-  void Unload(const std::string &name) { MoveOut(state, Addon(name), caption, failures); }
-  bool Shown(const std::string &text) const {
-    return std::count(caption.shown.begin(), caption.shown.end(), text) > 0;
-  }
+  void Load(const std::string &name) { MoveIn(state, folder.Addon(name), caption, failures); }
+  void Unload(const std::string &name) { MoveOut(state, folder.Addon(name), caption, failures); }
+  bool Shown(const std::string &text) const { return caption.Showed(text); }
 };
 
 } // namespace
@@ -104,7 +99,7 @@ TEST(MoveOut, DeletesOnlyTheCopiesLoadingMade) {
   EXPECT_TRUE(game.failures.Empty()); // gone.dat was deleted by hand
   EXPECT_TRUE(game.Shown("Deleting PLANES.DAT"));
   EXPECT_EQ(game.caption.text, "Selector");
-  EXPECT_EQ(game.folder.Read("ZEP128/FoldersLoaded.txt"), "\r\n");
+  EXPECT_EQ(game.folder.Record(), "\r\n");
 }
 
 TEST(MoveOut, CampaignIsNamedByCAndABlankOrHyphen) {

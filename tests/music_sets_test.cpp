@@ -1,6 +1,6 @@
 #include "settings/music_sets.h"
 #include "settings/music_switch.h"
-#include "tests/test_folder.h"
+#include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
 
@@ -24,7 +24,7 @@ void ExpectUntouched(const TestFolder &game) {
 } // namespace
 
 TEST(MusicSets, ListsSetsWithFoldersAndShowsTheLastOneWithoutAsCurrent) {
-  TestFolder game;
+  GameFolder game;
   Failures failures;
   EXPECT_TRUE(FillMusicList(game.Path(), failures).entries.empty());
   MakeThreeSets(game);
@@ -39,7 +39,7 @@ TEST(MusicSets, ListsSetsWithFoldersAndShowsTheLastOneWithoutAsCurrent) {
 }
 
 TEST(MusicSets, AFailedSwitchChangesNoFolderAndSaysSo) {
-  TestFolder game;
+  GameFolder game;
   MakeThreeSets(game);
   game.Write("NotAFolder", "file");
   Failures failures;

@@ -1,17 +1,20 @@
+#include "app/selector.h"
 #include "library/preview.h"
-
-#include "tests/test_folder.h"
+#include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
 
 namespace fs = std::filesystem;
 
 TEST(Preview, RebuiltOnlyWhenThePointerEntersAnotherRow) {
-  AppState state;
-  EXPECT_TRUE(EnterHoverRow(state, 3));
-  EXPECT_FALSE(EnterHoverRow(state, 3));
-  EXPECT_TRUE(EnterHoverRow(state, 0));
-  EXPECT_TRUE(EnterHoverRow(state, 3));
+  GameFolder game;
+  RecordingCaption caption;
+  NotingStarter starter;
+  Selector selector(game.Path(), caption, starter);
+  EXPECT_TRUE(selector.HoverRow(3));
+  EXPECT_FALSE(selector.HoverRow(3));
+  EXPECT_TRUE(selector.HoverRow(0));
+  EXPECT_TRUE(selector.HoverRow(3));
 }
 
 TEST(Preview, DescriptionAndFirstPictureInNameOrder) {
@@ -30,7 +33,7 @@ TEST(Preview, DescriptionAndFirstPictureInNameOrder) {
 
 TEST(Preview, HeaderRowRemovedFolderAndUnreadableDescriptionGiveAnEmptyPreview) {
   TestFolder lib;
-  AppState state;
+  LibraryState state;
   for (const char *name : {"S-Gone", "S-Locked"}) {
     GridRow folderRow;
     folderRow.path = lib.Path() / name;

@@ -1,9 +1,9 @@
 #include "library/reset_all.h"
 
-#include "library/listing.h"
-#include "library/refresh.h"
-#include "tests/recording_caption.h"
-#include "tests/test_folder.h"
+#include "app/startup.h"
+#include "base/listing.h"
+#include "library/record_replay.h"
+#include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
 
@@ -11,36 +11,44 @@ namespace fs = std::filesystem;
 
 using Names = std::vector<std::string>;
 
-// The game folder of the usual example, a few more names, and a library with one loaded folder.
-static void MakeGame(const TestFolder &game) {
-  for (const char *name : {"planes.dat", "hof.dat", "readme.txt", "chatline.txt", "pic1.bmp",
-                           "title.bmp", "dsg.ico", "eaw.exe", "mypic", "Extra.Spt",
-                           "Savedata/a.dat", "old.dat/inside.txt", "ZEP128/S-Camo/a.txt"})
-    game.Write(name);
-  game.Write("ZEP128/zep.ini", "Skins: S\r\n");
-  game.Write("ZEP128/FoldersLoaded.txt", "S-Camo\r\n\r\n");
-}
+namespace {
 
-TEST(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
-  TestFolder game;
-  MakeGame(game);
-  AppState state = StateFor(game.Path());
-  state.GridBackColor = 0xFFFFFF;
+// The game folder of the usual example, a few more names, and a library with one loaded folder.
+class ResetAll : public ::testing::Test {
+protected:
+  void SetUp() override {
+    for (const char *name : {"planes.dat", "hof.dat", "readme.txt", "chatline.txt", "pic1.bmp",
+                             "title.bmp", "dsg.ico", "eaw.exe", "mypic", "Extra.Spt",
+                             "Savedata/a.dat", "old.dat/inside.txt", "ZEP128/S-Camo/a.txt"})
+      game.Write(name);
+    game.WithCategories("Skins: S\r\n");
+    game.WithRecord("S-Camo\r\n\r\n");
+  }
+
+  GameFolder game;
+  LibraryState state = LibraryFor(game.Path());
   RecordingCaption caption;
   Failures failures;
-  Label33Click(state, caption, failures);
+};
+
+} // namespace
+
+TEST_F(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
+  state.GridBackColor = 0xFFFFFF;
+  BuildGrid(state, failures);
+  ReplayRecord(state, caption, failures);
   ASSERT_EQ(state.Unigrid.rows[1].mark, "S");
   state.Slots.frameVisible = true;
   state.Ready = false;
 
   for (int time = 0; time < 2; ++time) {
-    Command1Click(state, caption, failures);
+    ::ResetAll(state, caption, failures);
     EXPECT_EQ(ListFiles(game.Path()),
               (Names{"chatline.txt", "dsg.ico", "eaw.exe", "Extra.Spt", "hof.dat", "title.bmp"}));
     for (const char *kept : {"Savedata/a.dat", "old.dat/inside.txt", "ZEP128/S-Camo/a.txt"})
       EXPECT_TRUE(game.Exists(kept)) << kept;
     EXPECT_TRUE(game.Exists("ZEP128/FoldersLoaded.txt"));
-    EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "");
+    EXPECT_EQ(game.Record(), "");
   }
   EXPECT_EQ(caption.shown, (Names{"Please wait... cleaning up", "Selector",
                                   "Please wait... cleaning up", "Selector"}));
@@ -51,11 +59,7 @@ TEST(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
   EXPECT_TRUE(failures.Empty());
 }
 
-TEST(ResetAll, FirstLineOfCleanUpIniReplacesTheDefaultUnlessBlank) {
-  TestFolder game;
-  MakeGame(game);
-  const AppState state = StateFor(game.Path());
-  Failures failures;
+TEST_F(ResetAll, FirstLineOfCleanUpIniReplacesTheDefaultUnlessBlank) {
   game.Write("ZEP128/cleanup.INI", "*.dat\r\n*.txt\r\n");
   EXPECT_EQ(CleanUpNames(state, failures), (Names{"planes.dat"}));
   for (const char *blank : {"", "  \t\r\n*.dat", "\r\n*.dat"}) {
@@ -66,11 +70,7 @@ TEST(ResetAll, FirstLineOfCleanUpIniReplacesTheDefaultUnlessBlank) {
   EXPECT_TRUE(failures.Empty());
 }
 
-TEST(ResetAll, AFileThatCannotBeDeletedIsSkippedAndNamed) {
-  TestFolder game;
-  MakeGame(game);
-  const AppState state = StateFor(game.Path());
-  Failures failures;
+TEST_F(ResetAll, AFileThatCannotBeDeletedIsSkippedAndNamed) {
   const Names names = CleanUpNames(state, failures);
   // Something took the file's place after the listing: a folder that is not empty stays put.
   fs::remove(game.Path() / "pic1.bmp");

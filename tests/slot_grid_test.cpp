@@ -1,12 +1,11 @@
-#include "app/names.h"
-#include "app/text_file.h"
+#include "base/listing.h"
+#include "base/names.h"
+#include "base/text_file.h"
 #include "library/grid_builder.h"
 #include "library/grid_click.h"
-#include "library/listing.h"
 #include "slots/leading_number.h"
 #include "slots/plane_set.h"
-#include "tests/recording_caption.h"
-#include "tests/test_folder.h"
+#include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
 
@@ -27,8 +26,8 @@ std::string Description(const std::string &aircraft, const std::string &slot,
 } // namespace
 
 TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
-  TestFolder game;
-  AppState state = StateFor(game.Path());
+  GameFolder game;
+  LibraryState state = LibraryFor(game.Path());
   state.Ready = true;
   state.Slots.currentCellColour = 0xFFFFFF;
   const std::string pack = "ZEP128/F-Pack/";
@@ -43,9 +42,7 @@ TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
   RecordingCaption caption;
   Failures failures;
 
-  state.Unigrid.currentRow = 1; // F-Pack
-  UnigridClick(state, caption, failures);
-  EXPECT_TRUE(state.PlaneSetFound);
+  ClickRow(state, 1, caption, failures); // F-Pack
   EXPECT_TRUE(state.Slots.frameVisible);
   EXPECT_TRUE(state.Slots.gridVisible);
   EXPECT_EQ(state.GridBackColor, 0xFFFFFFu);
@@ -58,13 +55,11 @@ TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
   EXPECT_EQ(state.Slots.rows[1].plnSlot, "3 ");
   EXPECT_EQ(state.Slots.rows[1].skinSlot, "P38H");
 
-  state.Unigrid.currentRow = 2; // F-Plain replaces F-Pack
-  UnigridClick(state, caption, failures);
-  EXPECT_FALSE(state.PlaneSetFound);
+  ClickRow(state, 2, caption, failures); // F-Plain replaces F-Pack
   EXPECT_FALSE(state.Slots.frameVisible);
   EXPECT_EQ(state.Unigrid.rows[1].mark, "");
 
-  UnigridClick(state, caption, failures); // unload F-Plain
+  ClickRow(state, 2, caption, failures); // unload F-Plain
   EXPECT_TRUE(state.Slots.rows.empty());
   EXPECT_FALSE(state.Slots.frameVisible);
   EXPECT_TRUE(failures.Empty());

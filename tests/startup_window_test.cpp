@@ -1,6 +1,6 @@
 #include "app/category_file.h"
-#include "app/instance_lock_qt.h"
-#include "tests/test_folder.h"
+#include "platform/instance_lock.h"
+#include "tests/game_folder.h"
 #include "tests/window_driver.h"
 #include "ui/duplicate_instance.h"
 #include "ui/run_selector.h"
@@ -17,7 +17,7 @@
 namespace fs = std::filesystem;
 
 TEST(StartupWindow, FirstStartCreatesTheLibraryAndShowsAnEmptyGrid) {
-  TestFolder game;
+  GameFolder game;
   WindowDriver driver(game.Path());
   EXPECT_EQ(game.Read("ZEP128/zep.ini"), DefaultCategoryText());
   EXPECT_TRUE(game.Exists("ZEP128/FoldersLoaded.txt"));
@@ -32,7 +32,7 @@ TEST(StartupWindow, FirstStartCreatesTheLibraryAndShowsAnEmptyGrid) {
 }
 
 TEST(StartupWindow, WindowHasItsCaptionControlsAndPages) {
-  TestFolder game;
+  GameFolder game;
   WindowDriver driver(game.Path());
   MainWindow &window = driver.Window();
   EXPECT_EQ(window.windowTitle().size(), 108);
@@ -57,11 +57,11 @@ TEST(StartupWindow, WindowHasItsCaptionControlsAndPages) {
 }
 
 TEST(StartupWindow, RecordedFoldersShowGreenAfterARestart) {
-  TestFolder game;
-  game.Write("ZEP128/zep.ini", "Skins: S\r\nSounds: N\r\n");
+  GameFolder game;
+  game.WithCategories("Skins: S\r\nSounds: N\r\n");
   game.Write("ZEP128/S-one/a.dat");
   game.Write("ZEP128/N-two/b.dat");
-  game.Write("ZEP128/FoldersLoaded.txt", "N-two\r\n\r\n");
+  game.WithRecord("N-two\r\n\r\n");
   WindowDriver driver(game.Path());
   QAbstractItemModel *model = driver.Grid()->model();
   ASSERT_EQ(model->rowCount(), 2);
@@ -75,7 +75,7 @@ TEST(StartupWindow, RecordedFoldersShowGreenAfterARestart) {
 }
 
 TEST(StartupWindow, UnreadableCategoryFileIsToldOnceAndTheWindowStillStarts) {
-  TestFolder game;
+  GameFolder game;
   game.MakeFolder("ZEP128/zep.ini/in-the-way");
   game.MakeFolder("ZEP128/S-one");
   WindowDriver driver(game.Path());
@@ -86,7 +86,7 @@ TEST(StartupWindow, UnreadableCategoryFileIsToldOnceAndTheWindowStillStarts) {
 }
 
 TEST(StartupWindow, ExitMinimiseAndPointerOverTheLoaderPage) {
-  TestFolder game;
+  GameFolder game;
   WindowDriver driver(game.Path());
   driver.Find<QLabel>("MyLabel")->setText("old preview");
   driver.Find<QPlainTextEdit>("Text9")->setPlainText("kept");
@@ -101,7 +101,7 @@ TEST(StartupWindow, ExitMinimiseAndPointerOverTheLoaderPage) {
 }
 
 TEST(StartupWindow, SecondInstanceIsRefusedAndTouchesNoFile) {
-  TestFolder game;
+  GameFolder game;
   InstanceLock first(game.Path());
   ASSERT_TRUE(first.Acquired());
   QString title, text;

@@ -1,6 +1,7 @@
-#include "app/existence.h"
-#include "app/text_file.h"
-#include "library/listing.h"
+#include "base/existence.h"
+#include "base/file_ops.h"
+#include "base/listing.h"
+#include "base/text_file.h"
 #include "tests/test_folder.h"
 
 #include <gtest/gtest.h>

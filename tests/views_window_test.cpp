@@ -1,4 +1,4 @@
-#include "tests/test_folder.h"
+#include "tests/game_folder.h"
 #include "tests/window_driver.h"
 
 #include <QImage>
@@ -37,8 +37,8 @@ void HoverRow(WindowDriver &driver, int row) {
 } // namespace
 
 TEST(ViewsWindow, CategoriesShowTheirFoldersAndRule) {
-  TestFolder game;
-  game.Write("ZEP128/zep.ini", "Skins: S\r\nLower: s\r\nSounds: N\r\n");
+  GameFolder game;
+  game.WithCategories("Skins: S\r\nLower: s\r\nSounds: N\r\n");
   for (const char *name : {"S-a", "S b", "Sx", "s-c", "N-d"})
     game.MakeFolder(std::string("ZEP128/") + name);
   WindowDriver driver(game.Path());
@@ -60,8 +60,8 @@ TEST(ViewsWindow, CategoriesShowTheirFoldersAndRule) {
 }
 
 TEST(ViewsWindow, RefreshRereadsTheLibraryAndKeepsLoadedRowsGreen) {
-  TestFolder game;
-  game.Write("ZEP128/zep.ini", "Skins: S\r\n");
+  GameFolder game;
+  game.WithCategories("Skins: S\r\n");
   game.Write("ZEP128/S-keep/keep.dat", "library");
   game.Write("ZEP128/S-old/old.dat");
   WindowDriver driver(game.Path());
@@ -73,12 +73,12 @@ TEST(ViewsWindow, RefreshRereadsTheLibraryAndKeepsLoadedRowsGreen) {
   EXPECT_EQ(ShownFolders(driver), (QStringList{"S-keep", "S-new"}));
   EXPECT_EQ(driver.Grid()->model()->index(0, 2).data().toString(), "S");
   EXPECT_EQ(game.Read("keep.dat"), "changed in the game");
-  EXPECT_EQ(game.Read("ZEP128/FoldersLoaded.txt"), "S-keep\r\n\r\n");
+  EXPECT_EQ(game.Record(), "S-keep\r\n\r\n");
 }
 
 TEST(ViewsWindow, ResetAllDeletesAddOnFilesAndUnmarksEveryRow) {
-  TestFolder game;
-  game.Write("ZEP128/zep.ini", "Skins: S\r\n");
+  GameFolder game;
+  game.WithCategories("Skins: S\r\n");
   game.Write("ZEP128/S-one/planes.dat");
   for (const char *name :
        {"hof.dat", "readme.txt", "chatline.txt", "pic1.bmp", "title.bmp", "dsg.ico", "eaw.exe"})
@@ -98,8 +98,8 @@ TEST(ViewsWindow, ResetAllDeletesAddOnFilesAndUnmarksEveryRow) {
 }
 
 TEST(ViewsWindow, HoverShowsDescriptionAndPictureOfTheRowEntered) {
-  TestFolder game;
-  game.Write("ZEP128/zep.ini", "Skins: S\r\n");
+  GameFolder game;
+  game.WithCategories("Skins: S\r\n");
   game.Write("ZEP128/S-a/contents.TXT", "Line one\r\nLine two\nLine three");
   QImage picture(40, 30, QImage::Format_RGB32);
   picture.fill(Qt::red);

@@ -5,7 +5,9 @@
 #include <QTest>
 
 WindowDriver::WindowDriver(const std::filesystem::path &eawDir)
-    : window_(std::make_unique<MainWindow>(eawDir)) {
+    : window_(std::make_unique<MainWindow>(eawDir)),
+      gridModelTester_(std::make_unique<QAbstractItemModelTester>(
+          Grid()->model(), QAbstractItemModelTester::FailureReportingMode::Fatal)) {
   window_->FormLoad();
   window_->show();
   window_->findChild<QTabWidget *>("SSTab1")->setCurrentIndex(1);

@@ -2,6 +2,7 @@
 
 #include "ui/main_window.h"
 
+#include <QAbstractItemModelTester>
 #include <QStringList>
 #include <QTableView>
 #include <memory>
@@ -25,4 +26,6 @@ public:
 
 private:
   std::unique_ptr<MainWindow> window_;
+  // Checks every change of the folder grid's model against Qt's rules for item models.
+  std::unique_ptr<QAbstractItemModelTester> gridModelTester_;
 };

@@ -1,6 +1,6 @@
 #include "ui/folder_grid_model.h"
 
-#include "ui/qt_paths.h"
+#include "platform/qt_paths.h"
 #include "ui/twips.h"
 
 FolderGridModel::FolderGridModel(const FolderGrid &grid, QObject *parent)

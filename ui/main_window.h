@@ -1,19 +1,17 @@
 #pragma once
 
-#include "app/app_state.h"
-#include "app/failures.h"
+#include "app/selector.h"
+#include "platform/qt_program_starter.h"
 #include "ui/window_caption.h"
 #include "ui/window_layout.h"
 
-#include <QPixmap>
 #include <QWidget>
-#include <array>
 #include <filesystem>
 
 class FolderGridModel;
 
-// The program's one window: builds its controls, forwards their events to the logic and shows
-// the logic's state.
+// The program's one window: builds its controls, forwards their events to the Selector's verbs
+// and draws the Selector's state.
 class MainWindow : public QWidget {
   Q_OBJECT
 public:
@@ -22,20 +20,18 @@ public:
 
   // The start-up sequence, run once before the window is first shown.
   void FormLoad();
-  const AppState &State() const { return state_; }
-
-protected:
-  bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
   void WireEvents();
-  std::array<QLineEdit *, 6> SettingsBoxes() const;
+  void WireHooks();
   void Command3_Click();
   void Command8_Click();
   void ClearPreview();
   void List3_Click(int k);
   void Label33_Click();
   void Command1_Click();
+  void Unigrid_Click(const QModelIndex &index);
+  void Unigrid_KeyPress(int key);
   void Unigrid_MouseMove(int row);
   void IniRead();
   void inisave();
@@ -44,17 +40,17 @@ private:
   void FillMusicList();
   void List4_Click(QListWidgetItem *item);
   void delmsn_Click();
-  void Unigrid_Click(const QModelIndex &index);
-  void Unigrid_KeyPress(int key);
+  void ShowScreenSize();
   void ShowGridRows();
   void ShowGridChanges();
   void ShowSlotPanel();
   void ShowPicture(QLabel *label, const std::filesystem::path &picture);
-  void Tell(const Failures &failures, const QString &heading);
+  const SelectorState &State() const { return selector_.State(); }
 
-  AppState state_;
   Controls c_;
   WindowCaption caption_;
+  QtProgramStarter starter_;
+  Selector selector_;
   FolderGridModel *gridModel_;
   bool editorLatin1_ = false; // the eaw.ini editor's text came from Latin-1 bytes
 };

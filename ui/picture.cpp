@@ -1,6 +1,6 @@
 #include "ui/picture.h"
 
-#include "ui/qt_paths.h"
+#include "platform/qt_paths.h"
 
 #include <QImageReader>
 

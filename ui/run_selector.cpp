@@ -1,6 +1,6 @@
 #include "ui/run_selector.h"
 
-#include "app/instance_lock_qt.h"
+#include "platform/instance_lock.h"
 #include "ui/duplicate_instance.h"
 #include "ui/main_window.h"
 

@@ -1,12 +1,16 @@
 #include "ui/slot_grid_view.h"
 
-#include "ui/qt_paths.h"
+#include "platform/qt_paths.h"
 #include "ui/twips.h"
+
+#include <array>
 
 namespace {
 
-const char *const kHeaders[] = {"Folder", "PlnSlot", "SkinSlot", "Aircraft", ""};
-const int kWidthsTwips[] = {2000, 0, 0, 2000, 0};
+const std::array<const char *, kSlotColumns> kHeaders = {"Folder", "PlnSlot", "SkinSlot",
+                                                         "Aircraft", ""};
+// Width of each column; 0 hides it.
+const std::array<int, kSlotColumns> kWidthsTwips = {2000, 0, 0, 2000, 0};
 
 void SetCell(QTableWidget *grid, int row, int column, const QString &text) {
   grid->setItem(row, column, new QTableWidgetItem(text));
@@ -15,16 +19,17 @@ void SetCell(QTableWidget *grid, int row, int column, const QString &text) {
 } // namespace
 
 void FillSlotGrid(QTableWidget *grid, const SlotPanel &panel, const QColor &headerColour) {
-  const int columns = 5;
+  const int columns = kSlotColumns;
   grid->clear();
   grid->setColumnCount(columns);
   grid->setRowCount(1 + static_cast<int>(panel.rows.size()));
   for (int column = 0; column < columns; ++column) {
-    SetCell(grid, 0, column, kHeaders[column]);
+    SetCell(grid, 0, column, kHeaders[static_cast<size_t>(column)]);
     grid->item(0, column)->setBackground(headerColour);
-    grid->setColumnHidden(column, kWidthsTwips[column] == 0);
-    if (kWidthsTwips[column] > 0)
-      grid->setColumnWidth(column, TwipsToPixels(kWidthsTwips[column]));
+    const int width = kWidthsTwips[static_cast<size_t>(column)];
+    grid->setColumnHidden(column, width == 0);
+    if (width > 0)
+      grid->setColumnWidth(column, TwipsToPixels(width));
   }
   int row = 1;
   for (const SlotRow &slot : panel.rows) {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "app/caption.h"
+#include "base/caption.h"
 
 #include <QElapsedTimer>
 #include <QWidget>

@@ -82,9 +82,23 @@ void BuildWindowButtons(QWidget *window, Controls &c) {
       MakeFaceButton(window, "Command3", "Exit", Twips(13905, 60, 945, 555), "#FFC0C0", 9.75);
 }
 
-QLineEdit *MakeBox(QWidget *frame, const char *name, QRect place) {
-  QLineEdit *box = Make<QLineEdit>(frame, name, place);
-  return box;
+// Where each settings box sits, in the order of the settings keys.
+struct BoxPlace {
+  const char *name;
+  QRect place;
+};
+
+void BuildSettingsBoxes(QWidget *frame, Controls &c) {
+  const auto places = std::to_array<BoxPlace>({{"Text5", Twips(960, 2820, 705, 375)},
+                                               {"Text6", Twips(960, 3270, 705, 375)},
+                                               {"Text4", Twips(1410, 3840, 375, 345)},
+                                               {"Text7", Twips(1410, 4320, 525, 345)},
+                                               {"Text88", Twips(1410, 4740, 525, 345)},
+                                               {"Text11", Twips(1410, 5400, 525, 345)}});
+  static_assert(places.size() == kSettingCount, "one box for each setting");
+  for (size_t key = 0; key < kSettingCount; ++key)
+    c.SettingsBoxes[key] = Make<QLineEdit>(frame, places[key].name, places[key].place);
+  c.SettingsBoxes[2]->setText("0");
 }
 
 void BuildSettingsFrame(QWidget *page, QPoint origin, Controls &c) {
@@ -102,18 +116,12 @@ void BuildSettingsFrame(QWidget *page, QPoint origin, Controls &c) {
                         Twips(180, 1710, 1815, 945), {}, Wrap::Yes);
   SetFont(c.Label32, 9.75);
   MakeLabel(f, "Label30(1)", "Width", Twips(150, 2880, 675, 315));
-  c.Text5 = MakeBox(f, "Text5", Twips(960, 2820, 705, 375));
   MakeLabel(f, "Label31(1)", "Height", Twips(150, 3330, 675, 315));
-  c.Text6 = MakeBox(f, "Text6", Twips(960, 3270, 705, 375));
   MakeLabel(f, "Label31(2)", "Extra Squads", Twips(210, 3900, 1095, 315));
-  c.Text4 = MakeBox(f, "Text4", Twips(1410, 3840, 375, 345));
-  c.Text4->setText("0");
   MakeLabel(f, "Label34(0)", "Day", Twips(930, 4380, 285, 255));
-  c.Text7 = MakeBox(f, "Text7", Twips(1410, 4320, 525, 345));
   MakeLabel(f, "Label34(1)", "Month", Twips(810, 4800, 495, 255));
-  c.Text88 = MakeBox(f, "Text88", Twips(1410, 4740, 525, 345));
   MakeLabel(f, "Label34(2)", "Planeset", Twips(210, 5490, 975, 255));
-  c.Text11 = MakeBox(f, "Text11", Twips(1410, 5400, 525, 345));
+  BuildSettingsBoxes(f, c);
   c.IniEdit = Make<WrappingButton>(f, "IniEdit", Twips(60, 5910, 2115, 645));
   c.IniEdit->setText("Display \"eaw.ini' for inspection or further editing");
 }

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "settings/eaw_ini.h"
+
 #include <QFrame>
 #include <QGroupBox>
 #include <QLabel>
@@ -10,6 +12,7 @@
 #include <QTabWidget>
 #include <QTableView>
 #include <QTableWidget>
+#include <array>
 
 // Every control of the main window, named as the window's logic knows them.
 struct Controls {
@@ -21,7 +24,8 @@ struct Controls {
   QGroupBox *Frame2;
   QLabel *Label5, *Label32;
   QLabel *Label18[2];
-  QLineEdit *Text5, *Text6, *Text4, *Text7, *Text88, *Text11;
+  // Text5, Text6, Text4, Text7, Text88 and Text11: one box per setting, in key order.
+  std::array<QLineEdit *, kSettingCount> SettingsBoxes;
   QPushButton *IniEdit;
   QGroupBox *Frame21;
   QPushButton *InSaver;

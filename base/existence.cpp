@@ -1,4 +1,4 @@
-#include "app/existence.h"
+#include "base/existence.h"
 
 #include <system_error>
 

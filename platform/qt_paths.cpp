@@ -1,4 +1,4 @@
-#include "ui/qt_paths.h"
+#include "platform/qt_paths.h"
 
 #include <QFile>
 #include <QStringDecoder>

@@ -1,7 +1,7 @@
-#include "library/name_index.h"
+#include "base/name_index.h"
 
-#include "app/names.h"
-#include "library/listing.h"
+#include "base/listing.h"
+#include "base/names.h"
 
 #include <algorithm>
 

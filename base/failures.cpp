@@ -1,6 +1,6 @@
-#include "app/failures.h"
+#include "base/failures.h"
 
-#include "app/names.h"
+#include "base/names.h"
 
 #include <algorithm>
 

@@ -1,10 +1,11 @@
-#include "app/text_file.h"
+#include "base/text_file.h"
+
+#include "base/existence.h"
 
 #include <cerrno>
 #include <cstring>
 #include <fstream>
 #include <iterator>
-#include <system_error>
 
 namespace fs = std::filesystem;
 
@@ -51,48 +52,17 @@ std::optional<std::vector<std::string>> ReadLines(const fs::path &path, Failures
   return SplitLines(*bytes);
 }
 
+std::optional<std::vector<std::string>> ReadLinesIfExists(const fs::path &path,
+                                                          Failures &failures) {
+  FileCheck(path);
+  if (!FileFound)
+    return std::nullopt;
+  return ReadLines(path, failures);
+}
+
 std::string JoinCrLf(const std::vector<std::string> &lines) {
   std::string text;
   for (const std::string &line : lines)
     text += line + "\r\n";
   return text;
-}
-
-static bool WriteWhole(const fs::path &path, const std::string &bytes) {
-  std::ofstream out(path, std::ios::binary | std::ios::trunc);
-  if (!out)
-    return false;
-  out.write(bytes.data(), static_cast<std::streamsize>(bytes.size()));
-  out.close();
-  return !out.fail();
-}
-
-fs::path PartialPath(const fs::path &target) {
-  fs::path partial = target;
-  partial += ".partial";
-  return partial;
-}
-
-void RemovePartial(const fs::path &partial) {
-  std::error_code error;
-  if (fs::is_regular_file(partial, error))
-    fs::remove(partial, error);
-}
-
-bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures &failures) {
-  const fs::path temporary = PartialPath(target);
-  errno = 0;
-  if (!WriteWhole(temporary, bytes)) {
-    failures.Add(target, "cannot be written (" + LastErrorText() + ")");
-    RemovePartial(temporary);
-    return false;
-  }
-  std::error_code error;
-  fs::rename(temporary, target, error);
-  if (error) {
-    failures.Add(target, "cannot be replaced (" + error.message() + ")");
-    RemovePartial(temporary);
-    return false;
-  }
-  return true;
 }

@@ -1,6 +1,6 @@
-#include "library/listing.h"
+#include "base/listing.h"
 
-#include "app/names.h"
+#include "base/names.h"
 
 #include <algorithm>
 #include <system_error>

@@ -1,4 +1,4 @@
-#include "app/names.h"
+#include "base/names.h"
 
 #include <algorithm>
 #include <system_error>

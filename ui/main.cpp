@@ -1,4 +1,4 @@
-#include "ui/qt_paths.h"
+#include "platform/qt_paths.h"
 #include "ui/run_selector.h"
 
 #include <QApplication>

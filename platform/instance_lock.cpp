@@ -1,6 +1,6 @@
-#include "app/instance_lock_qt.h"
+#include "platform/instance_lock.h"
 
-#include "ui/qt_paths.h"
+#include "platform/qt_paths.h"
 
 #include <QCryptographicHash>
 #include <QDir>

@@ -1,0 +1,92 @@
+#include "app/selector.h"
+
+#include "app/category_file.h"
+#include "app/startup.h"
+#include "library/category_view.h"
+#include "library/grid_click.h"
+#include "library/loaded_record.h"
+#include "library/record_replay.h"
+#include "library/reset_all.h"
+#include "settings/game_start.h"
+#include "settings/ini_editor.h"
+#include "settings/music_switch.h"
+
+namespace fs = std::filesystem;
+
+Selector::Selector(const fs::path &eawDir, Caption &caption, ProgramStarter &starter)
+    : caption_(caption), starter_(starter) {
+  static_cast<LibraryState &>(state_) = LibraryFor(eawDir);
+}
+
+void Selector::StartUp(Failures &failures) {
+  state_.Ready = false;
+  const std::vector<SkippedLine> skipped = PrepareLibrary(state_, failures);
+  BuildGrid(state_, failures);
+  EnsureRecord(state_, failures);
+  ReplayRecord(state_, caption_, failures);
+  state_.BackPic = GamePicture(state_.EAWDir, "background");
+  state_.NewPic = GamePicture(state_.EAWDir, "newpic");
+  ShowCategory(0);
+  state_.Ready = true;
+  if (!skipped.empty())
+    failures.Add(SkippedLinesMessage(skipped));
+}
+
+std::string Selector::ShowCategory(int entry) {
+  return ::ShowCategory(state_.Unigrid, state_.Codes, entry);
+}
+
+void Selector::ClickRow(int row, Failures &failures) {
+  ::ClickRow(state_, row, caption_, failures);
+}
+
+void Selector::PressKey(int row, int key, Failures &failures) {
+  PressKeyOnRow(state_, row, key, caption_, failures);
+}
+
+void Selector::RefreshLibrary(Failures &failures) {
+  state_.Ready = false;
+  // Start-up writes both files when missing; a rebuild needs them just the same.
+  EnsureCategoryFile(state_.LibDir, failures);
+  BuildGrid(state_, failures);
+  EnsureRecord(state_, failures);
+  ReplayRecord(state_, caption_, failures);
+  // The rows under the pointer are other folders now, so the next move rebuilds the preview.
+  state_.HoverRow = -1;
+  state_.Ready = true;
+}
+
+void Selector::ResetAll(Failures &failures) { ::ResetAll(state_, caption_, failures); }
+
+std::optional<FolderPreview> Selector::HoverRow(int row) {
+  if (row == state_.HoverRow)
+    return std::nullopt;
+  state_.HoverRow = row;
+  return PreviewOfRow(state_, row);
+}
+
+IniValues Selector::ReadSettings(Failures &failures) {
+  const ReadyGuard reading(state_, false);
+  return IniRead(state_.EAWDir, failures);
+}
+
+void Selector::SaveSettings(const IniTexts &texts, Failures &failures) {
+  inisave(state_.EAWDir, state_.Ready, texts, failures);
+}
+
+std::string Selector::SettingsFileText(Failures &failures) {
+  return IniDisplayText(state_.EAWDir, failures);
+}
+
+bool Selector::SaveSettingsFile(const std::string &text, Failures &failures) {
+  return IniEditorSave(state_.EAWDir, text, failures);
+}
+
+MusicList Selector::MusicSets(Failures &failures) { return FillMusicList(state_.EAWDir, failures); }
+
+bool Selector::SwitchMusic(const std::string &activeName, const std::string &chosenName,
+                           Failures &failures) {
+  return ::SwitchMusic(state_.EAWDir, activeName, chosenName, failures);
+}
+
+void Selector::StartGame(Failures &failures) { ::StartGame(state_.EAWDir, starter_, failures); }

@@ -1,0 +1,60 @@
+#pragma once
+
+#include "app/selector_state.h"
+#include "base/caption.h"
+#include "base/failures.h"
+#include "base/program_starter.h"
+#include "library/preview.h"
+#include "settings/eaw_ini.h"
+#include "settings/music_sets.h"
+
+#include <filesystem>
+#include <optional>
+#include <string>
+
+// What the program can do, for one game folder: the window calls these verbs and draws State().
+// Every verb records what it could not do in `failures` and finishes the rest.
+class Selector {
+public:
+  // `caption` shows the progress of long file work; `starter` starts the game.
+  Selector(const std::filesystem::path &eawDir, Caption &caption, ProgramStarter &starter);
+
+  const SelectorState &State() const { return state_; }
+
+  // Creates the library's files when missing, reads the categories, builds the grid, marks the
+  // recorded folders loaded without touching a file, finds the pictures and shows every folder.
+  void StartUp(Failures &failures);
+  // Shows category list entry `entry`; returns the text of the code-letter label.
+  std::string ShowCategory(int entry);
+  // Loads or unloads the folder of grid row `row` (a click on it).
+  void ClickRow(int row, Failures &failures);
+  // A key pressed on grid row `row`: Enter acts as a click.
+  void PressKey(int row, int key, Failures &failures);
+  // Rebuilds the grid from the library on disk, keeping the loaded marks.
+  void RefreshLibrary(Failures &failures);
+  // Deletes the add-on files from the game folder and empties the record.
+  void ResetAll(Failures &failures);
+  // The preview of grid row `row` when the pointer has entered it; nothing when it was already
+  // over that row.
+  std::optional<FolderPreview> HoverRow(int row);
+  // The six settings of eaw.ini as the boxes show them.
+  IniValues ReadSettings(Failures &failures);
+  // Writes the six box texts into eaw.ini.
+  void SaveSettings(const IniTexts &texts, Failures &failures);
+  // The whole of eaw.ini for the editor.
+  std::string SettingsFileText(Failures &failures);
+  // Saves the editor's text as eaw.ini; true when it was written.
+  bool SaveSettingsFile(const std::string &text, Failures &failures);
+  // The music sets of Music.ini.
+  MusicList MusicSets(Failures &failures);
+  // Makes `chosenName` the game's music in place of `activeName`; true when switched.
+  bool SwitchMusic(const std::string &activeName, const std::string &chosenName,
+                   Failures &failures);
+  // Starts the game.
+  void StartGame(Failures &failures);
+
+private:
+  SelectorState state_;
+  Caption &caption_;
+  ProgramStarter &starter_;
+};

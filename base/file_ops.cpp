@@ -1,0 +1,142 @@
+#include "base/file_ops.h"
+
+#include "base/names.h"
+#include "base/text_file.h"
+
+#include <cerrno>
+#include <fstream>
+#include <optional>
+#include <system_error>
+
+#ifdef _WIN32
+#include <windows.h>
+#endif
+
+namespace fs = std::filesystem;
+
+#ifdef _WIN32
+// Hidden, system and archive cannot be told apart cheaply here: every file is made normal.
+static bool IsNormal(const fs::path &) { return false; }
+
+bool MakeNormal(const fs::path &path, Failures &failures) {
+  if (SetFileAttributesW(path.c_str(), FILE_ATTRIBUTE_NORMAL))
+    return true;
+  failures.Add(path, "cannot be made writable (" +
+                         std::system_category().message(static_cast<int>(GetLastError())) + ")");
+  return false;
+}
+#else
+static bool IsNormal(const fs::path &path) {
+  std::error_code error;
+  return (fs::status(path, error).permissions() & fs::perms::owner_write) != fs::perms::none;
+}
+
+bool MakeNormal(const fs::path &path, Failures &failures) { return MakeWritable(path, failures); }
+#endif
+
+bool MakeWritable(const fs::path &path, Failures &failures) {
+  std::error_code error;
+  const fs::perms perms = fs::status(path, error).permissions();
+  if (!error && (perms & fs::perms::owner_write) != fs::perms::none)
+    return true;
+  if (!error)
+    fs::permissions(path, perms | fs::perms::owner_write, fs::perm_options::replace, error);
+  if (!error)
+    return true;
+  failures.Add(path, "cannot be made writable (" + error.message() + ")");
+  return false;
+}
+
+fs::path PartialPath(const fs::path &target) {
+  fs::path partial = target;
+  partial += ".partial";
+  return partial;
+}
+
+void RemovePartial(const fs::path &partial) {
+  std::error_code error;
+  if (fs::is_regular_file(partial, error))
+    fs::remove(partial, error);
+}
+
+static bool WriteWhole(const fs::path &path, const std::string &bytes) {
+  std::ofstream out(path, std::ios::binary | std::ios::trunc);
+  if (!out)
+    return false;
+  out.write(bytes.data(), static_cast<std::streamsize>(bytes.size()));
+  out.close();
+  return !out.fail();
+}
+
+static std::optional<fs::perms> PermissionsOf(const fs::path &path) {
+  std::error_code error;
+  const fs::file_status status = fs::status(path, error);
+  if (error || !fs::exists(status))
+    return std::nullopt;
+  return status.permissions();
+}
+
+bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures &failures) {
+  const fs::path temporary = PartialPath(target);
+  errno = 0;
+  if (!WriteWhole(temporary, bytes)) {
+    failures.Add(target, "cannot be written (" + LastErrorText() + ")");
+    RemovePartial(temporary);
+    return false;
+  }
+  // Windows refuses to rename over a read-only file.
+  const std::optional<fs::perms> before = PermissionsOf(target);
+  if (before && !MakeWritable(target, failures)) {
+    RemovePartial(temporary);
+    return false;
+  }
+  std::error_code error;
+  fs::rename(temporary, target, error);
+  if (error) {
+    failures.Add(target, "cannot be replaced (" + error.message() + ")");
+    RemovePartial(temporary);
+    if (before)
+      fs::permissions(target, *before, error);
+    return false;
+  }
+  if (before)
+    fs::permissions(target, *before | fs::perms::owner_write, error);
+  return true;
+}
+
+bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures) {
+  const fs::path temporary = PartialPath(target);
+  std::error_code error;
+  fs::copy_file(source, temporary, fs::copy_options::overwrite_existing, error);
+  if (error) {
+    failures.Add(source,
+                 "cannot be copied to " + DisplayPath(target) + " (" + error.message() + ")");
+    RemovePartial(temporary);
+    return false;
+  }
+#ifdef _WIN32
+  // Windows refuses to replace a read-only file; a missing target is no failure here.
+  SetFileAttributesW(target.c_str(), FILE_ATTRIBUTE_NORMAL);
+#endif
+  fs::rename(temporary, target, error);
+  if (error) {
+    failures.Add(target, "cannot be replaced (" + error.message() + ")");
+    RemovePartial(temporary);
+    return false;
+  }
+  // The copy carries the source's attributes, so a normal source leaves nothing to do.
+  if (!IsNormal(source)) {
+    MakeNormal(source, failures);
+    MakeNormal(target, failures);
+  }
+  return true;
+}
+
+bool RemoveFile(const fs::path &path, Failures &failures) {
+  std::error_code error;
+  fs::remove(path, error);
+  if (!error)
+    return true;
+  failures.Add(path, "cannot be deleted (" + error.message() + ")");
+  return false;
+}

@@ -1,0 +1,29 @@
+#pragma once
+
+#include "base/failures.h"
+
+#include <filesystem>
+#include <string>
+
+// Gives `path` normal attributes: writable (and on Windows not hidden, system or archive).
+// False, with the reason in `failures`, when that fails.
+bool MakeNormal(const std::filesystem::path &path, Failures &failures);
+// Makes `path` writable and changes nothing else. False, with the reason, when that fails.
+bool MakeWritable(const std::filesystem::path &path, Failures &failures);
+// Replaces `target` by `bytes` through a temporary file beside it and a rename, so that the file
+// is always either the old or the new one; a replaced file keeps its permissions and ends
+// writable. Returns false, with the reason, on failure; the old file is then left as it was.
+bool WriteAtomically(const std::filesystem::path &target, const std::string &bytes,
+                     Failures &failures);
+// Copies `source` over `target` through the temporary file "<target>.partial" and a rename, so
+// that `target` is always either the old file or a complete copy; source and copy end normal.
+// False, with the reason in `failures`, when the copy could not be put in place; attributes that
+// cannot be changed are reported without undoing the copy.
+bool CopyReplacing(const std::filesystem::path &source, const std::filesystem::path &target,
+                   Failures &failures);
+// Deletes the file `path`. False, with the reason in `failures`, when it cannot be deleted.
+bool RemoveFile(const std::filesystem::path &path, Failures &failures);
+// The temporary file beside `target` that a replacement is written to before it is renamed.
+std::filesystem::path PartialPath(const std::filesystem::path &target);
+// Removes what a failed replacement left, but never a folder that merely has the temporary name.
+void RemovePartial(const std::filesystem::path &partial);

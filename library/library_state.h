@@ -1,0 +1,36 @@
+#pragma once
+
+#include "library/folder_grid.h"
+#include "slots/slot_table.h"
+
+#include <cstdint>
+#include <filesystem>
+
+// What loading, unloading, the record and the grid views share: the paths, the `Ready` flag, the
+// folder grid and the slot panel.
+struct LibraryState {
+  std::filesystem::path EAWDir;
+  std::filesystem::path LibDir;
+  bool Ready = false;
+  std::uint32_t GridBackColor = 0; // 0 shows as the grid's default white
+  FolderGrid Unigrid;
+  SlotPanel Slots;
+};
+
+// The library state for the game folder `eawDir`, with `LibDir` (its "ZEP128" in any case).
+LibraryState LibraryFor(const std::filesystem::path &eawDir);
+
+// Sets `Ready` for one operation and puts back what it was when the operation ends.
+class ReadyGuard {
+public:
+  ReadyGuard(LibraryState &state, bool ready) : ready_(state.Ready), saved_(state.Ready) {
+    ready_ = ready;
+  }
+  ~ReadyGuard() { ready_ = saved_; }
+  ReadyGuard(const ReadyGuard &) = delete;
+  ReadyGuard &operator=(const ReadyGuard &) = delete;
+
+private:
+  bool &ready_;
+  bool saved_;
+};

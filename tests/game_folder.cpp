@@ -1,0 +1,47 @@
+#include "tests/game_folder.h"
+
+#include <algorithm>
+
+namespace fs = std::filesystem;
+
+const GameFolder &GameFolder::WithGameFolders() const {
+  MakeFolder("Savedata");
+  MakeFolder("Music");
+  return *this;
+}
+
+const GameFolder &GameFolder::WithCategories(const std::string &lines) const {
+  Write("ZEP128/zep.ini", lines);
+  return *this;
+}
+
+const GameFolder &GameFolder::WithRecord(const std::string &bytes) const {
+  Write("ZEP128/FoldersLoaded.txt", bytes);
+  return *this;
+}
+
+fs::path GameFolder::Addon(const std::string &name,
+                           std::initializer_list<const char *> files) const {
+  const fs::path folder = MakeFolder("ZEP128/" + name);
+  for (const char *file : files)
+    Write("ZEP128/" + name + "/" + file, file);
+  return folder;
+}
+
+bool RecordingCaption::Showed(const std::string &line) const {
+  return std::find(shown.begin(), shown.end(), line) != shown.end();
+}
+
+std::vector<std::string> RowNames(const FolderGrid &grid, bool marks) {
+  std::vector<std::string> names;
+  for (int row = 1; row < grid.RowCount(); ++row)
+    names.push_back(grid.Row(row).name + (marks && IsLoaded(grid.Row(row)) ? " [S]" : ""));
+  return names;
+}
+
+int RowOf(const FolderGrid &grid, const std::string &name, int after) {
+  for (int row = after + 1; row < grid.RowCount(); ++row)
+    if (grid.Row(row).name == name)
+      return row;
+  return 0;
+}

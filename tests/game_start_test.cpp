@@ -1,0 +1,27 @@
+#include "app/selector.h"
+#include "tests/game_folder.h"
+
+#include <gtest/gtest.h>
+
+TEST(GameStart, WindowsProgramsAreToldApartAndAMissingGameIsNamed) {
+  GameFolder game;
+  RecordingCaption caption;
+  NotingStarter starter;
+  Selector selector(game.Path(), caption, starter);
+  Failures failures;
+  selector.StartGame(failures);
+  ASSERT_EQ(failures.Lines().size(), 1u);
+  EXPECT_NE(failures.Lines()[0].find("eaw.exe was not found"), std::string::npos);
+  EXPECT_TRUE(starter.started.empty());
+
+  game.Write("EAW.EXE", "MZ\x90");
+  selector.StartGame(failures);
+  game.Write("EAW.EXE", "#!/bin/sh\n");
+  selector.StartGame(failures);
+  game.Write("EAW.EXE", "M");
+  selector.StartGame(failures);
+  EXPECT_EQ(starter.windows, (std::vector<bool>{true, false, false}));
+  ASSERT_EQ(starter.started.size(), 3u);
+  EXPECT_EQ(starter.started[0], game.Path() / "EAW.EXE");
+  EXPECT_EQ(failures.Lines().size(), 1u);
+}
