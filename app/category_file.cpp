@@ -68,7 +68,8 @@ Categories ParseCategories(const std::vector<std::string> &lines) {
 }
 
 Categories ReadCategories(const fs::path &libDir, Failures &failures) {
-  std::optional<std::vector<std::string>> lines = ReadLines(CategoryPath(libDir), failures);
+  std::optional<std::vector<std::string>> lines =
+      ReadLines(CategoryPath(libDir), failures, Encoding::Text);
   return lines ? ParseCategories(*lines) : Categories{};
 }
 

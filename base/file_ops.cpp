@@ -55,8 +55,13 @@ fs::path PartialPath(const fs::path &target) {
 
 void RemovePartial(const fs::path &partial) {
   std::error_code error;
-  if (fs::is_regular_file(partial, error))
-    fs::remove(partial, error);
+  if (!fs::is_regular_file(partial, error))
+    return;
+#ifdef _WIN32
+  // A copy of a read-only file left by a crash is read-only too, and Windows keeps it otherwise.
+  SetFileAttributesW(partial.c_str(), FILE_ATTRIBUTE_NORMAL);
+#endif
+  fs::remove(partial, error);
 }
 
 static bool WriteWhole(const fs::path &path, const std::string &bytes) {
@@ -78,6 +83,7 @@ static std::optional<fs::perms> PermissionsOf(const fs::path &path) {
 
 bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures &failures) {
   const fs::path temporary = PartialPath(target);
+  RemovePartial(temporary);
   errno = 0;
   if (!WriteWhole(temporary, bytes)) {
     failures.Add(target, "cannot be written (" + LastErrorText() + ")");
@@ -106,6 +112,8 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
 
 bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures) {
   const fs::path temporary = PartialPath(target);
+  // What an interrupted copy left may be read-only: it must not block this one.
+  RemovePartial(temporary);
   std::error_code error;
   fs::copy_file(source, temporary, fs::copy_options::overwrite_existing, error);
   if (error) {
@@ -132,11 +140,30 @@ bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &fai
   return true;
 }
 
-bool RemoveFile(const fs::path &path, Failures &failures) {
+#ifdef _WIN32
+// Windows refuses to delete a read-only file: clears the attribute and returns the attributes to
+// put back if the deletion fails anyway.
+static DWORD AllowDeletion(const fs::path &path) {
+  const DWORD attributes = GetFileAttributesW(path.c_str());
+  if (attributes == INVALID_FILE_ATTRIBUTES || !(attributes & FILE_ATTRIBUTE_READONLY))
+    return INVALID_FILE_ATTRIBUTES;
+  SetFileAttributesW(path.c_str(), attributes & ~DWORD{FILE_ATTRIBUTE_READONLY});
+  return attributes;
+}
+#endif
+
+bool RemoveFile(const fs::path &path, Failures &failures, const std::string &problem) {
+#ifdef _WIN32
+  const DWORD restore = AllowDeletion(path);
+#endif
   std::error_code error;
   fs::remove(path, error);
   if (!error)
     return true;
-  failures.Add(path, "cannot be deleted (" + error.message() + ")");
+#ifdef _WIN32
+  if (restore != INVALID_FILE_ATTRIBUTES)
+    SetFileAttributesW(path.c_str(), restore);
+#endif
+  failures.Add(path, problem + " (" + error.message() + ")");
   return false;
 }

@@ -21,8 +21,10 @@ bool WriteAtomically(const std::filesystem::path &target, const std::string &byt
 // cannot be changed are reported without undoing the copy.
 bool CopyReplacing(const std::filesystem::path &source, const std::filesystem::path &target,
                    Failures &failures);
-// Deletes the file `path`. False, with the reason in `failures`, when it cannot be deleted.
-bool RemoveFile(const std::filesystem::path &path, Failures &failures);
+// Deletes the file `path`, also a read-only one. False when it cannot be deleted: `failures` then
+// names it with `problem` and the reason, and its attributes are as they were.
+bool RemoveFile(const std::filesystem::path &path, Failures &failures,
+                const std::string &problem = "cannot be deleted");
 // The temporary file beside `target` that a replacement is written to before it is renamed.
 std::filesystem::path PartialPath(const std::filesystem::path &target);
 // Removes what a failed replacement left, but never a folder that merely has the temporary name.

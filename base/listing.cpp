@@ -11,13 +11,24 @@
 
 namespace fs = std::filesystem;
 
+// Where the UTF-8 character that starts at `at` ends: "?" stands for one character, not a byte.
+static size_t CharacterEnd(std::string_view name, size_t at) {
+  ++at;
+  while (at < name.size() && (static_cast<unsigned char>(name[at]) & 0xC0) == 0x80)
+    ++at;
+  return at;
+}
+
 static bool MatchFrom(std::string_view name, std::string_view pattern) {
   size_t n = 0, p = 0, starP = std::string_view::npos, starN = 0;
   while (n < name.size()) {
     if (p < pattern.size() && pattern[p] == '*') {
       starP = p++;
       starN = n;
-    } else if (p < pattern.size() && (pattern[p] == '?' || pattern[p] == name[n])) {
+    } else if (p < pattern.size() && pattern[p] == '?') {
+      ++p;
+      n = CharacterEnd(name, n);
+    } else if (p < pattern.size() && pattern[p] == name[n]) {
       ++p;
       ++n;
     } else if (starP != std::string_view::npos) {
@@ -35,7 +46,7 @@ static bool MatchFrom(std::string_view name, std::string_view pattern) {
 bool MatchesPattern(std::string_view name, std::string_view pattern) {
   if (pattern == "*.*")
     return true;
-  return MatchFrom(Upper(name), Upper(pattern));
+  return MatchFrom(FoldName(name), FoldName(pattern));
 }
 
 bool MatchesPatternList(std::string_view name, std::string_view patterns) {

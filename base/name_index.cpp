@@ -7,13 +7,13 @@
 
 NameIndex::NameIndex(const std::filesystem::path &folder) {
   for (std::string &name : ListFiles(folder))
-    byUpper_[Upper(name)].push_back(std::move(name));
+    byFolded_[FoldName(name)].push_back(std::move(name));
 }
 
 const std::vector<std::string> &NameIndex::Matches(std::string_view name) const {
   static const std::vector<std::string> none;
-  const auto found = byUpper_.find(Upper(name));
-  return found == byUpper_.end() ? none : found->second;
+  const auto found = byFolded_.find(FoldName(name));
+  return found == byFolded_.end() ? none : found->second;
 }
 
 std::string NameIndex::TargetName(const std::string &name) const {
@@ -24,14 +24,14 @@ std::string NameIndex::TargetName(const std::string &name) const {
 }
 
 void NameIndex::Add(const std::string &name) {
-  std::vector<std::string> &names = byUpper_[Upper(name)];
+  std::vector<std::string> &names = byFolded_[FoldName(name)];
   if (std::find(names.begin(), names.end(), name) == names.end())
     names.push_back(name);
 }
 
 void NameIndex::Remove(const std::string &name) {
-  const auto found = byUpper_.find(Upper(name));
-  if (found == byUpper_.end())
+  const auto found = byFolded_.find(FoldName(name));
+  if (found == byFolded_.end())
     return;
   std::vector<std::string> &names = found->second;
   names.erase(std::remove(names.begin(), names.end(), name), names.end());

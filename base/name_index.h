@@ -6,7 +6,7 @@
 #include <unordered_map>
 #include <vector>
 
-// The plain files of one folder by upper-cased name, listed once, so that any number of
+// The plain files of one folder by folded name (see FoldName), listed once, so that any number of
 // case-insensitive look-ups costs a single listing.
 class NameIndex {
 public:
@@ -21,5 +21,5 @@ public:
   void Remove(const std::string &name);
 
 private:
-  std::unordered_map<std::string, std::vector<std::string>> byUpper_;
+  std::unordered_map<std::string, std::vector<std::string>> byFolded_;
 };

@@ -1,7 +1,17 @@
 #include "base/names.h"
 
+#include "base/text_encoding.h"
+
 #include <algorithm>
 #include <system_error>
+
+#ifdef _WIN32
+#include <windows.h>
+#else
+#include <clocale>
+#include <cwctype>
+#include <locale.h>
+#endif
 
 namespace fs = std::filesystem;
 
@@ -24,7 +34,8 @@ fs::path Child(const fs::path &folder, std::string_view name) {
 
 std::string DisplayPath(const fs::path &path) {
 #ifdef _WIN32
-  const std::u8string text = path.u8string();
+  // A path from Qt or a literal may use "/": the player sees Windows' own separator only.
+  const std::u8string text = fs::path(path).make_preferred().u8string();
   return std::string(text.begin(), text.end());
 #else
   return path.string();
@@ -37,6 +48,74 @@ std::string Upper(std::string_view text) {
   std::string out(text);
   std::transform(out.begin(), out.end(), out.begin(), UpperChar);
   return out;
+}
+
+static bool IsAscii(std::string_view text) {
+  return std::all_of(text.begin(), text.end(),
+                     [](char c) { return static_cast<unsigned char>(c) < 0x80; });
+}
+
+#ifdef _WIN32
+static std::wstring Wide(std::string_view utf8) {
+  const int size = static_cast<int>(utf8.size());
+  std::wstring wide(
+      static_cast<size_t>(MultiByteToWideChar(CP_UTF8, 0, utf8.data(), size, nullptr, 0)), L'\0');
+  MultiByteToWideChar(CP_UTF8, 0, utf8.data(), size, wide.data(), static_cast<int>(wide.size()));
+  return wide;
+}
+
+static std::string Narrow(const std::wstring &wide) {
+  const int size = static_cast<int>(wide.size());
+  std::string utf8(static_cast<size_t>(WideCharToMultiByte(CP_UTF8, 0, wide.data(), size, nullptr,
+                                                           0, nullptr, nullptr)),
+                   '\0');
+  WideCharToMultiByte(CP_UTF8, 0, wide.data(), size, utf8.data(), static_cast<int>(utf8.size()),
+                      nullptr, nullptr);
+  return utf8;
+}
+
+// The system's own upper case, which its ordinal case-insensitive comparison uses.
+static std::string FoldNonAscii(std::string_view name) {
+  std::wstring wide = Wide(name);
+  CharUpperBuffW(wide.data(), static_cast<DWORD>(wide.size()));
+  return Narrow(wide);
+}
+#else
+// Upper case of lower case is simple case folding, in upper case, for all but the Turkish dotted
+// and dotless i, which fold to themselves.
+static char32_t FoldCodePoint(char32_t c, locale_t utf8) {
+  if (c == 0x130 || c == 0x131)
+    return c;
+  return static_cast<char32_t>(towupper_l(towlower_l(static_cast<wint_t>(c), utf8), utf8));
+}
+
+static std::string FoldNonAscii(std::string_view name) {
+  static const locale_t utf8 = newlocale(LC_CTYPE_MASK, "C.UTF-8", locale_t{});
+  if (!utf8)
+    return Upper(name);
+  std::string out;
+  char32_t c = 0;
+  for (size_t at = 0; at < name.size();) {
+    if (NextCodePoint(name, at, c))
+      AppendUtf8(out, FoldCodePoint(c, utf8));
+    else
+      out += name[at++];
+  }
+  return out;
+}
+#endif
+
+std::string FoldName(std::string_view name) {
+  return IsAscii(name) ? Upper(name) : FoldNonAscii(name);
+}
+
+std::string StoredName(std::string_view name) {
+#ifdef _WIN32
+  const size_t kept = name.find_last_not_of(" .");
+  return std::string(name.substr(0, kept == std::string_view::npos ? 0 : kept + 1));
+#else
+  return std::string(name);
+#endif
 }
 
 bool EndsWith(std::string_view text, std::string_view tail) {
@@ -65,9 +144,9 @@ fs::path FindAnyCase(const fs::path &folder, std::string_view name) {
   std::error_code error;
   if (fs::exists(exact, error))
     return exact;
-  const std::string wanted = Upper(name);
+  const std::string wanted = FoldName(name);
   for (fs::directory_iterator it(folder, error), end; !error && it != end; it.increment(error)) {
-    if (Upper(NameText(it->path())) == wanted)
+    if (FoldName(NameText(it->path())) == wanted)
       return it->path();
   }
   return exact;

@@ -11,8 +11,15 @@ std::string NameText(const std::filesystem::path &path);
 std::filesystem::path Child(const std::filesystem::path &folder, std::string_view name);
 // A full path for messages and captions.
 std::string DisplayPath(const std::filesystem::path &path);
-// ASCII upper case, the way file names are compared; other bytes stay as they are.
+// ASCII upper case, for comparing names with the program's own ASCII names and extensions;
+// other bytes stay as they are.
 std::string Upper(std::string_view text);
+// The name with its letter case folded the way the file system ignores it, so that two names of
+// one file give the same text: on Windows the system's ordinal upper case, elsewhere Unicode
+// simple case folding of UTF-8 (ASCII letters in upper case). Bytes that are not UTF-8 stay.
+std::string FoldName(std::string_view name);
+// The name a file gets when created as `name`: Windows drops trailing blanks and dots.
+std::string StoredName(std::string_view name);
 bool EndsWith(std::string_view text, std::string_view tail);
 bool StartsWith(std::string_view text, std::string_view head);
 // Case-insensitive name order, ties broken by the exact bytes, the same on every platform.

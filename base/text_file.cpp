@@ -1,6 +1,7 @@
 #include "base/text_file.h"
 
 #include "base/existence.h"
+#include "base/text_encoding.h"
 
 #include <cerrno>
 #include <cstring>
@@ -45,19 +46,20 @@ std::optional<std::string> ReadBytes(const fs::path &path, Failures &failures) {
   return bytes;
 }
 
-std::optional<std::vector<std::string>> ReadLines(const fs::path &path, Failures &failures) {
+std::optional<std::vector<std::string>> ReadLines(const fs::path &path, Failures &failures,
+                                                  Encoding encoding) {
   std::optional<std::string> bytes = ReadBytes(path, failures);
   if (!bytes)
     return std::nullopt;
-  return SplitLines(*bytes);
+  return SplitLines(encoding == Encoding::Text ? TextAsUtf8(*bytes) : *bytes);
 }
 
-std::optional<std::vector<std::string>> ReadLinesIfExists(const fs::path &path,
-                                                          Failures &failures) {
+std::optional<std::vector<std::string>> ReadLinesIfExists(const fs::path &path, Failures &failures,
+                                                          Encoding encoding) {
   FileCheck(path);
   if (!FileFound)
     return std::nullopt;
-  return ReadLines(path, failures);
+  return ReadLines(path, failures, encoding);
 }
 
 std::string JoinCrLf(const std::vector<std::string> &lines) {

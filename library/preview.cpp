@@ -10,7 +10,7 @@ namespace fs = std::filesystem;
 static std::string Description(const fs::path &file) {
   // A description is a courtesy: one that cannot be read just leaves the preview empty.
   Failures ignored;
-  const auto lines = ReadLines(file, ignored);
+  const auto lines = ReadLines(file, ignored, Encoding::Text);
   return lines ? JoinCrLf(*lines) : "";
 }
 

@@ -1,5 +1,6 @@
 #include "library/record_replay.h"
 
+#include "base/text_encoding.h"
 #include "library/grid_click.h"
 #include "library/loaded_record.h"
 
@@ -14,7 +15,9 @@ void ReplayRecord(LibraryState &state, Caption &caption, Failures &failures) {
   std::unordered_multimap<std::string, int> rowsByName;
   for (int row = 1; row < grid.RowCount(); ++row)
     rowsByName.emplace(grid.Row(row).name, row);
-  for (const std::string &name : ReadLoadedNames(state, failures)) {
+  for (const std::string &line : ReadLoadedNames(state, failures)) {
+    // A record written in Windows-1252 names the folders that UTF-8 names differently.
+    const std::string name = rowsByName.count(line) ? line : TextAsUtf8(line);
     auto [first, last] = rowsByName.equal_range(name);
     std::vector<int> rows;
     for (auto it = first; it != last; ++it)

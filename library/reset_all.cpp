@@ -21,7 +21,8 @@ static bool IsProtected(const std::string &name) {
 
 std::string CleanUpPatterns(const fs::path &libDir, Failures &failures) {
   // An empty list would delete nothing and a blank one is surely a slip: keep the default.
-  const auto lines = ReadLinesIfExists(FindAnyCase(libDir, "CleanUp.ini"), failures);
+  const auto lines =
+      ReadLinesIfExists(FindAnyCase(libDir, "CleanUp.ini"), failures, Encoding::Text);
   if (!lines || lines->empty() || IsBlank(lines->front()))
     return kDefaultCleanUpPatterns;
   return lines->front();

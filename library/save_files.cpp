@@ -29,10 +29,7 @@ void CarrySaveFiles(const fs::path &eawDir, const fs::path &campaign, Failures &
     if (!CopyReplacing(source, Child(campaign, target), failures))
       continue;
     campaignFiles.Add(target);
-    std::error_code error;
-    fs::remove(source, error);
-    if (error)
-      failures.Add(source, "was copied to " + DisplayPath(campaign) + " but cannot be deleted (" +
-                               error.message() + ")");
+    RemoveFile(source, failures,
+               "was copied to " + DisplayPath(campaign) + " but cannot be deleted");
   }
 }

@@ -1,12 +1,14 @@
 #include "platform/qt_paths.h"
 
+#include "base/text_encoding.h"
+
 #include <QFile>
 #include <QStringDecoder>
 
 namespace fs = std::filesystem;
 
 #ifdef _WIN32
-fs::path ToPath(const QString &text) { return fs::path(text.toStdWString()); }
+fs::path ToPath(const QString &text) { return fs::path(text.toStdWString()).make_preferred(); }
 QString FromPath(const fs::path &path) { return QString::fromStdWString(path.wstring()); }
 QString FromName(const std::string &name) { return QString::fromUtf8(name); }
 std::string ToName(const QString &text) { return text.toStdString(); }
@@ -17,15 +19,17 @@ QString FromName(const std::string &name) { return QFile::decodeName(name.c_str(
 std::string ToName(const QString &text) { return QFile::encodeName(text).toStdString(); }
 #endif
 
-QString FromText(const std::string &bytes, bool *latin1) {
-  QStringDecoder utf8(QStringDecoder::Utf8);
-  const QString text = utf8(QByteArrayView(bytes.data(), static_cast<qsizetype>(bytes.size())));
-  if (latin1)
-    *latin1 = utf8.hasError();
-  return utf8.hasError() ? QString::fromLatin1(bytes.data(), static_cast<qsizetype>(bytes.size()))
-                         : text;
+QString FromText(const std::string &bytes, bool *windows1252) {
+  const bool utf8 = IsUtf8(bytes);
+  if (windows1252)
+    *windows1252 = !utf8;
+  const std::string text = utf8 ? bytes : Windows1252ToUtf8(bytes);
+  // A byte-order mark is part of the file, so it stays in the text.
+  QStringDecoder decoder(QStringDecoder::Utf8, QStringConverter::Flag::ConvertInitialBom);
+  return decoder(QByteArrayView(text.data(), static_cast<qsizetype>(text.size())));
 }
 
-std::string ToText(const QString &text, bool latin1) {
-  return latin1 ? text.toLatin1().toStdString() : text.toStdString();
+std::string ToText(const QString &text, bool windows1252) {
+  const std::string utf8 = text.toStdString();
+  return windows1252 ? ToWindows1252(utf8) : utf8;
 }

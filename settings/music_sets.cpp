@@ -2,6 +2,7 @@
 
 #include "base/listing.h"
 #include "base/names.h"
+#include "base/text_encoding.h"
 #include "base/text_file.h"
 
 #include <set>
@@ -14,10 +15,10 @@ bool IsMusicSetName(std::string_view line) {
   return line.find_first_not_of(" \t") != std::string_view::npos;
 }
 
-static std::set<std::string> FolderNamesUpper(const fs::path &folder) {
+static std::set<std::string> FoldedFolderNames(const fs::path &folder) {
   std::set<std::string> names;
   for (const fs::path &path : ListFolders(folder))
-    names.insert(Upper(NameText(path)));
+    names.insert(FoldName(NameText(path)));
   return names;
 }
 
@@ -27,11 +28,18 @@ MusicList FillMusicList(const fs::path &eawDir, Failures &failures) {
       ReadLinesIfExists(FindAnyCase(eawDir, "Music.ini"), failures);
   if (!lines)
     return list;
-  const std::set<std::string> folders = FolderNamesUpper(eawDir);
-  for (const std::string &name : *lines) {
-    if (!IsMusicSetName(name))
+  const std::set<std::string> folders = FoldedFolderNames(eawDir);
+  // A folder is found the way the platform finds it: any letter case, and on Windows without
+  // trailing blanks and dots.
+  const auto hasFolder = [&](const std::string &name) {
+    return folders.count(FoldName(StoredName(name))) > 0;
+  };
+  for (const std::string &line : *lines) {
+    if (!IsMusicSetName(line))
       continue;
-    if (folders.count(Upper(name)))
+    // Names are bytes; a Music.ini written in Windows-1252 names UTF-8 folders as text.
+    const std::string name = hasFolder(line) ? line : TextAsUtf8(line);
+    if (hasFolder(name))
       list.entries.push_back(name);
     else
       list.current = name;

@@ -118,3 +118,28 @@ TEST(SettingsWindow, FlyStartsTheGameEachTimeOrSaysWhyNot) {
   EXPECT_TRUE(driver.Window().isVisible());
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 }
+
+TEST(SettingsWindow, EditorSavesUnchangedTextByteForByte) {
+  GameFolder game;
+  WindowDriver driver(game.Path());
+  auto *text = driver.Find<QPlainTextEdit>("Text14");
+  // A byte-order mark, no-break spaces and Unicode line and paragraph separators in UTF-8, then
+  // curly quotes and a no-break space in Windows-1252.
+  for (const std::string &ini : {std::string("\xEF\xBB\xBFWidth=800\xC2\xA0\r\nName=a\xE2\x80\xA8"
+                                             "b\xE2\x80\xA9"
+                                             "c\r\n"),
+                                 std::string("Pilot=\x93"
+                                             "Ace\x94\xA0\x81\r\n")}) {
+    game.Write("eaw.ini", ini);
+    QTest::mouseClick(driver.Find<QPushButton>("IniEdit"), Qt::LeftButton);
+    QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
+    EXPECT_EQ(game.Read("eaw.ini"), ini + "\r\n");
+  }
+  EXPECT_TRUE(text->toPlainText().startsWith(QString::fromUtf8("Pilot=\u201CAce\u201D")));
+
+  text->moveCursor(QTextCursor::End);
+  text->insertPlainText("Day=3\n");
+  QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
+  EXPECT_EQ(game.Read("eaw.ini"), "Pilot=\x93"
+                                  "Ace\x94\xA0\x81\r\nDay=3\r\n\r\n");
+}

@@ -215,15 +215,28 @@ void MainWindow::inisave() {
 void MainWindow::IniEdit_Click() {
   c_.Frame21->show();
   Failures failures;
-  c_.Text14->setPlainText(FromText(selector_.SettingsFileText(failures), &editorLatin1_));
+  editorShown_ = FromText(selector_.SettingsFileText(failures), &editorWindows1252_);
+  c_.Text14->setPlainText(editorShown_);
+  editorShownPlain_ = c_.Text14->toPlainText();
   ShowFailures(this, failures, "The settings file could not be shown:");
 }
 
 void MainWindow::InSaver_Click() {
   Failures failures;
-  if (selector_.SaveSettingsFile(ToText(c_.Text14->toPlainText(), editorLatin1_), failures))
+  if (selector_.SaveSettingsFile(ToText(EditorText(), editorWindows1252_), failures))
     IniRead();
   ShowFailures(this, failures, "The settings file could not be saved:");
+}
+
+// The editor's text as the player left it. Plain text would turn no-break spaces into blanks and
+// line separators into line ends, so an unchanged text is the one shown, and a changed one is
+// taken raw with only the breaks between paragraphs made line ends.
+QString MainWindow::EditorText() const {
+  if (c_.Text14->toPlainText() == editorShownPlain_)
+    return editorShown_;
+  QString text = c_.Text14->document()->toRawText();
+  text.replace(QChar::ParagraphSeparator, '\n');
+  return text;
 }
 
 void MainWindow::FillMusicList() {

@@ -52,5 +52,9 @@ private:
   QtProgramStarter starter_;
   Selector selector_;
   FolderGridModel *gridModel_;
-  bool editorLatin1_ = false; // the eaw.ini editor's text came from Latin-1 bytes
+  QString EditorText() const;
+
+  bool editorWindows1252_ = false; // the eaw.ini editor's text came from Windows-1252 bytes
+  QString editorShown_;            // the text the editor was given
+  QString editorShownPlain_;       // the same as the editor gives it back
 };

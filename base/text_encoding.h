@@ -1,0 +1,21 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+
+// Reads the code point of UTF-8 `text` that starts at `at` into `c` and moves `at` past it;
+// false, with `at` unchanged, for a byte that starts no valid sequence.
+bool NextCodePoint(std::string_view text, size_t &at, char32_t &c);
+// Appends code point `c` to `out` in UTF-8.
+void AppendUtf8(std::string &out, char32_t c);
+// Whether `bytes` are valid UTF-8 (shortest forms, no surrogates, nothing past U+10FFFF).
+bool IsUtf8(std::string_view bytes);
+// Windows-1252 bytes as UTF-8; the five bytes the code page leaves undefined become the control
+// characters of the same number, so that ToWindows1252 gives every byte back.
+std::string Windows1252ToUtf8(std::string_view bytes);
+// UTF-8 text as Windows-1252 bytes, the inverse of Windows1252ToUtf8; a character the code page
+// lacks becomes "?".
+std::string ToWindows1252(std::string_view utf8);
+// Text from a file written on Windows: the bytes when they are valid UTF-8, otherwise read as
+// Windows-1252 (what Notepad and older tools write) and given as UTF-8.
+std::string TextAsUtf8(std::string_view bytes);
