@@ -194,8 +194,9 @@ int main(int argc, char **argv) {
   works.push_back(MakeWorkload(root, "crowded", 2000, 0, 18000));
   for (const Workload &work : works) {
     for (auto [label, function] :
-         {std::pair{"PlainCopy", BenchPlainCopy}, std::pair{"MoveIn", BenchMoveIn},
-          std::pair{"PlainRemoval", BenchPlainRemoval}, std::pair{"MoveOut", BenchMoveOut}})
+         {std::make_pair("PlainCopy", BenchPlainCopy), std::make_pair("MoveIn", BenchMoveIn),
+          std::make_pair("PlainRemoval", BenchPlainRemoval),
+          std::make_pair("MoveOut", BenchMoveOut)})
       benchmark::RegisterBenchmark((std::string(label) + "/" + work.name).c_str(), function, &work)
           ->Unit(benchmark::kMillisecond)
           ->UseRealTime()

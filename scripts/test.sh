@@ -1,5 +1,6 @@
 #!/usr/bin/env bash
-# Installs what is missing, builds with sanitizers and warnings as errors, runs every test headless.
+# Installs what is missing, builds with sanitizers and warnings as errors, runs every test headless,
+# then cross-builds the logic tests for Windows and runs them under Wine.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 bash scripts/install_deps.sh
@@ -10,3 +11,4 @@ export QT_QPA_PLATFORM=offscreen
 export ASAN_OPTIONS=detect_leaks=0
 export UBSAN_OPTIONS=print_stacktrace=1
 ctest --test-dir "$build" --output-on-failure -j "$(nproc)"
+bash scripts/test_windows.sh
