@@ -1,4 +1,5 @@
 #include "app/selector.h"
+#include "base/names.h"
 #include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
@@ -22,6 +23,7 @@ TEST(GameStart, WindowsProgramsAreToldApartAndAMissingGameIsNamed) {
   selector.StartGame(failures);
   EXPECT_EQ(starter.windows, (std::vector<bool>{true, false, false}));
   ASSERT_EQ(starter.started.size(), 3u);
-  EXPECT_EQ(starter.started[0], game.Path() / "EAW.EXE");
+  EXPECT_EQ(starter.started[0].parent_path(), game.Path());
+  EXPECT_EQ(Upper(NameText(starter.started[0])), "EAW.EXE");
   EXPECT_EQ(failures.Lines().size(), 1u);
 }

@@ -1,4 +1,5 @@
 #include "base/listing.h"
+#include "base/names.h"
 #include "library/move_in.h"
 #include "library/move_out.h"
 #include "library/save_files.h"
@@ -41,7 +42,7 @@ TEST(MoveIn, PutsEachFileWhereTheGameLooksForIt) {
   EXPECT_EQ(game.folder.Read("readme.txt"), "readme.txt");
   // The game's own file of that name in another case is replaced, not doubled.
   EXPECT_EQ(game.folder.Read("TITLE.BMP"), "title.bmp");
-  EXPECT_FALSE(game.folder.Exists("title.bmp"));
+  EXPECT_EQ(ListFiles(game.folder.Path(), "title.bmp"), std::vector<std::string>{"TITLE.BMP"});
   EXPECT_EQ(ListFolders(game.folder.Path()).size(), 3u); // Music, SAVEDATA, ZEP128
   for (const char *kept :
        {"mypic", "Contents.TXT", "eca_note.dat", "model.ldr", "pic.jpg", "skin.PCX", "anim.gif"})
@@ -75,9 +76,10 @@ TEST(MoveIn, FileThatCannotBeCopiedIsSkippedAndReported) {
   EXPECT_TRUE(fs::is_directory(game.folder.Path() / "c.dat.partial"));
   EXPECT_FALSE(game.folder.Exists("c.dat"));
   EXPECT_FALSE(game.folder.Exists("b.dat.partial"));
-  const std::string message = game.failures.Message("");
+  // Where letter case makes no difference, the file "savedata" is the folder "Savedata".
+  const std::string message = Upper(game.failures.Message(""));
   for (const char *failed : {"b.dat", "c.dat", "e.msn", "savedata"})
-    EXPECT_NE(message.find(failed), std::string::npos) << failed;
+    EXPECT_NE(message.find(Upper(failed)), std::string::npos) << failed;
 }
 
 TEST(MoveOut, DeletesOnlyTheCopiesLoadingMade) {
@@ -92,9 +94,10 @@ TEST(MoveOut, DeletesOnlyTheCopiesLoadingMade) {
 
   for (const char *gone : {"Savedata/A.MSN", "Music/c.bgm", "PLANES.DAT"})
     EXPECT_FALSE(game.folder.Exists(gone)) << gone;
-  // Two files matching one name is no copy of ours; the game's own files and saves stay.
-  for (const char *kept :
-       {"dup.dat", "DUP.DAT", "contents.txt", "MYPIC", "pic.jpg", "Savedata/keep.sve"})
+  // Two files matching one name is no copy of ours; the game's own files and saves stay. Where
+  // letter case makes no difference, "dup.dat" is one file, the copy.
+  EXPECT_EQ(game.folder.Exists("DUP.DAT"), IsCaseSensitive(game.folder.Path()));
+  for (const char *kept : {"contents.txt", "MYPIC", "pic.jpg", "Savedata/keep.sve"})
     EXPECT_TRUE(game.folder.Exists(kept)) << kept;
   EXPECT_TRUE(game.failures.Empty()); // gone.dat was deleted by hand
   EXPECT_TRUE(game.Shown("Deleting PLANES.DAT"));

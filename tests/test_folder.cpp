@@ -1,5 +1,7 @@
 #include "tests/test_folder.h"
 
+#include "base/names.h"
+
 #include <atomic>
 #include <fstream>
 #include <iterator>
@@ -25,21 +27,24 @@ TestFolder::~TestFolder() {
 }
 
 fs::path TestFolder::Write(const std::string &relative, const std::string &bytes) const {
-  const fs::path target = path_ / relative;
+  const fs::path target = Child(path_, relative);
   fs::create_directories(target.parent_path());
   std::ofstream(target, std::ios::binary) << bytes;
   return target;
 }
 
 fs::path TestFolder::MakeFolder(const std::string &relative) const {
-  fs::create_directories(path_ / relative);
-  return path_ / relative;
+  const fs::path folder = Child(path_, relative);
+  fs::create_directories(folder);
+  return folder;
 }
 
-bool TestFolder::Exists(const std::string &relative) const { return fs::exists(path_ / relative); }
+bool TestFolder::Exists(const std::string &relative) const {
+  return fs::exists(Child(path_, relative));
+}
 
 std::string TestFolder::Read(const std::string &relative) const {
-  std::ifstream in(path_ / relative, std::ios::binary);
+  std::ifstream in(Child(path_, relative), std::ios::binary);
   return std::string((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
 }
 
@@ -50,4 +55,12 @@ bool IsWritable(const fs::path &path) {
 void SetReadOnly(const fs::path &path, bool readOnly) {
   const fs::perms write = fs::perms::owner_write | fs::perms::group_write | fs::perms::others_write;
   fs::permissions(path, write, readOnly ? fs::perm_options::remove : fs::perm_options::add);
+}
+
+bool IsCaseSensitive(const fs::path &folder) {
+  const fs::path probe = folder / "case-probe";
+  std::ofstream(probe) << "x";
+  const bool sensitive = !fs::exists(folder / "CASE-PROBE");
+  fs::remove(probe);
+  return sensitive;
 }

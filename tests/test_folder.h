@@ -12,7 +12,7 @@ public:
   TestFolder &operator=(const TestFolder &) = delete;
 
   const std::filesystem::path &Path() const { return path_; }
-  // Writes `bytes` to `relative`, creating the folders on the way.
+  // Writes `bytes` to `relative` (UTF-8, "/" between names), creating the folders on the way.
   std::filesystem::path Write(const std::string &relative, const std::string &bytes = "x") const;
   // Creates the folder `relative` and those on the way.
   std::filesystem::path MakeFolder(const std::string &relative) const;
@@ -23,6 +23,8 @@ private:
   std::filesystem::path path_;
 };
 
+// Whether `folder` holds two files whose names differ only in letter case as two files.
+bool IsCaseSensitive(const std::filesystem::path &folder);
 // Whether `path` can be written to by its owner.
 bool IsWritable(const std::filesystem::path &path);
 // Makes `path` read-only (or writable again).
