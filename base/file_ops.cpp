@@ -92,6 +92,9 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
   }
   // Windows refuses to rename over a read-only file.
   const std::optional<fs::perms> before = PermissionsOf(target);
+#ifdef _WIN32
+  const DWORD attributes = GetFileAttributesW(target.c_str());
+#endif
   if (before && !MakeWritable(target, failures)) {
     RemovePartial(temporary);
     return false;
@@ -107,6 +110,11 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
   }
   if (before)
     fs::permissions(target, *before | fs::perms::owner_write, error);
+#ifdef _WIN32
+  // A hidden or system file stays so; only read-only is gone.
+  if (attributes != INVALID_FILE_ATTRIBUTES)
+    SetFileAttributesW(target.c_str(), attributes & ~DWORD{FILE_ATTRIBUTE_READONLY});
+#endif
   return true;
 }
 
