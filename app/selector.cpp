@@ -2,10 +2,13 @@
 
 #include "app/category_file.h"
 #include "app/startup.h"
+#include "base/file_ops.h"
 #include "library/category_view.h"
 #include "library/grid_click.h"
+#include "library/keeping.h"
 #include "library/loaded_record.h"
 #include "library/record_replay.h"
+#include "library/recovery.h"
 #include "library/reset_all.h"
 #include "settings/game_start.h"
 #include "settings/ini_editor.h"
@@ -19,6 +22,10 @@ Selector::Selector(const fs::path &eawDir, Caption &caption, ProgramStarter &sta
 }
 
 void Selector::StartUp(Failures &failures) {
+  FinishMusicSwitch(state_.EAWDir, MusicJournal(), failures);
+  FinishInterrupted(state_, caption_, failures);
+  RemovePartial(PartialPath(IniPath(state_.EAWDir)));
+  RemovePartial(PartialPath(CategoryPath(state_.LibDir)));
   state_.Ready = false;
   const std::vector<SkippedLine> skipped = PrepareLibrary(state_, failures);
   BuildGrid(state_, failures);
@@ -36,12 +43,25 @@ std::string Selector::ShowCategory(int entry) {
   return ::ShowCategory(state_.Unigrid, state_.Codes, entry);
 }
 
-void Selector::ClickRow(int row, Failures &failures) {
-  ::ClickRow(state_, row, caption_, failures);
+// What the player should know about files a load replaced.
+static std::string ReplacedNotice(const std::string &loaded,
+                                  const std::vector<std::string> &folders) {
+  if (folders.empty())
+    return "";
+  std::string names;
+  for (const std::string &folder : folders)
+    names += (names.empty() ? "\"" : ", \"") + folder + "\"";
+  return "\"" + loaded + "\" replaced files of " + names + ", which stay loaded. Unloading \"" +
+         loaded + "\" puts their files back.";
 }
 
-void Selector::PressKey(int row, int key, Failures &failures) {
-  PressKeyOnRow(state_, row, key, caption_, failures);
+std::string Selector::ClickRow(int row, Failures &failures) {
+  const std::vector<std::string> replaced = ::ClickRow(state_, row, caption_, failures);
+  return replaced.empty() ? "" : ReplacedNotice(state_.Unigrid.Row(row).name, replaced);
+}
+
+std::string Selector::PressKey(int row, int key, Failures &failures) {
+  return key == kEnterKey ? ClickRow(row, failures) : "";
 }
 
 void Selector::RefreshLibrary(Failures &failures) {
@@ -56,7 +76,13 @@ void Selector::RefreshLibrary(Failures &failures) {
   state_.Ready = true;
 }
 
-void Selector::ResetAll(Failures &failures) { ::ResetAll(state_, caption_, failures); }
+std::vector<std::string> Selector::ResetAllFiles(Failures &failures) const {
+  return CleanUpNames(state_, failures);
+}
+
+void Selector::ResetAll(const std::vector<std::string> &names, Failures &failures) {
+  ::ResetAll(state_, names, caption_, failures);
+}
 
 std::optional<FolderPreview> Selector::HoverRow(int row) {
   if (row == state_.HoverRow)
@@ -86,7 +112,9 @@ MusicList Selector::MusicSets(Failures &failures) { return FillMusicList(state_.
 
 bool Selector::SwitchMusic(const std::string &activeName, const std::string &chosenName,
                            Failures &failures) {
-  return ::SwitchMusic(state_.EAWDir, activeName, chosenName, failures);
+  return ::SwitchMusic(state_.EAWDir, activeName, chosenName, MusicJournal(), failures);
 }
 
 void Selector::StartGame(Failures &failures) { ::StartGame(state_.EAWDir, starter_, failures); }
+
+fs::path Selector::MusicJournal() const { return KeepingFolder(state_.LibDir) / "music.txt"; }

@@ -11,6 +11,7 @@
 #include <filesystem>
 #include <optional>
 #include <string>
+#include <vector>
 
 // What the program can do, for one game folder: the window calls these verbs and draws State().
 // Every verb records what it could not do in `failures` and finishes the rest.
@@ -21,19 +22,24 @@ public:
 
   const SelectorState &State() const { return state_; }
 
-  // Creates the library's files when missing, reads the categories, builds the grid, marks the
-  // recorded folders loaded without touching a file, finds the pictures and shows every folder.
+  // Finishes or rolls back what a crash interrupted, creates the library's files when missing,
+  // reads the categories, builds the grid, marks the recorded folders loaded without touching a
+  // file, finds the pictures and shows every folder.
   void StartUp(Failures &failures);
   // Shows category list entry `entry`; returns the text of the code-letter label.
   std::string ShowCategory(int entry);
-  // Loads or unloads the folder of grid row `row` (a click on it).
-  void ClickRow(int row, Failures &failures);
+  // Loads or unloads the folder of grid row `row` (a click on it). Returns what the player should
+  // know beyond failures: which loaded folders' files a load replaced; empty when nothing.
+  std::string ClickRow(int row, Failures &failures);
   // A key pressed on grid row `row`: Enter acts as a click.
-  void PressKey(int row, int key, Failures &failures);
+  std::string PressKey(int row, int key, Failures &failures);
   // Rebuilds the grid from the library on disk, keeping the loaded marks.
   void RefreshLibrary(Failures &failures);
-  // Deletes the add-on files from the game folder and empties the record.
-  void ResetAll(Failures &failures);
+  // The game-folder files that Reset All would delete, for the player to agree to.
+  std::vector<std::string> ResetAllFiles(Failures &failures) const;
+  // Deletes the add-on files `names` from the game folder, puts the kept originals back and
+  // empties the record.
+  void ResetAll(const std::vector<std::string> &names, Failures &failures);
   // The preview of grid row `row` when the pointer has entered it; nothing when it was already
   // over that row.
   std::optional<FolderPreview> HoverRow(int row);
@@ -54,6 +60,8 @@ public:
   void StartGame(Failures &failures);
 
 private:
+  std::filesystem::path MusicJournal() const;
+
   SelectorState state_;
   Caption &caption_;
   ProgramStarter &starter_;

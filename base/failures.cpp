@@ -13,8 +13,8 @@ void Failures::Add(const std::string &text) {
     lines_.push_back(text);
 }
 
-std::string Failures::Message(const std::string &heading) const {
-  std::string text = heading;
+std::string Failures::Message(const std::string &fallback) const {
+  std::string text = HeadingOr(fallback);
   for (const std::string &line : lines_)
     text += "\n" + line;
   return text;

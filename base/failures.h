@@ -13,9 +13,17 @@ public:
   void Add(const std::string &text);
   bool Empty() const { return lines_.empty(); }
   const std::vector<std::string> &Lines() const { return lines_; }
-  // One message naming every failure, one per line, after `heading`.
-  std::string Message(const std::string &heading) const;
+  // Gives the message a heading that says more than the caller's: what the failures mean.
+  void SetHeading(const std::string &heading) { heading_ = heading; }
+  // The heading set by SetHeading, or else `fallback`.
+  const std::string &HeadingOr(const std::string &fallback) const {
+    return heading_.empty() ? fallback : heading_;
+  }
+  // One message naming every failure, one per line, after the heading (`fallback` when none was
+  // set).
+  std::string Message(const std::string &fallback) const;
 
 private:
   std::vector<std::string> lines_;
+  std::string heading_;
 };

@@ -139,6 +139,16 @@ bool NameLess(std::string_view a, std::string_view b) {
   return a < b;
 }
 
+std::vector<fs::path> EntriesAnyCase(const fs::path &folder, std::string_view name) {
+  std::vector<fs::path> entries;
+  const std::string wanted = FoldName(name);
+  std::error_code error;
+  for (fs::directory_iterator it(folder, error), end; !error && it != end; it.increment(error))
+    if (FoldName(NameText(it->path())) == wanted)
+      entries.push_back(it->path());
+  return entries;
+}
+
 fs::path FindAnyCase(const fs::path &folder, std::string_view name) {
   const fs::path exact = Child(folder, name);
   std::error_code error;

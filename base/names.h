@@ -3,6 +3,7 @@
 #include <filesystem>
 #include <string>
 #include <string_view>
+#include <vector>
 
 // A file or folder name as the program keeps it in grids and records: the native bytes on POSIX,
 // UTF-8 on Windows.
@@ -24,5 +25,8 @@ bool EndsWith(std::string_view text, std::string_view tail);
 bool StartsWith(std::string_view text, std::string_view head);
 // Case-insensitive name order, ties broken by the exact bytes, the same on every platform.
 bool NameLess(std::string_view a, std::string_view b);
+// Every entry of `folder` whose name equals `name` in any letter case.
+std::vector<std::filesystem::path> EntriesAnyCase(const std::filesystem::path &folder,
+                                                  std::string_view name);
 // The entry of `folder` whose name equals `name` in any letter case, or `folder`/`name` if none.
 std::filesystem::path FindAnyCase(const std::filesystem::path &folder, std::string_view name);

@@ -8,7 +8,7 @@ bool StaysInLibrary(std::string_view name) {
   const std::string upper = Upper(name);
   return StartsWith(upper, "ECA") || EndsWith(upper, ".LDR") || EndsWith(upper, ".JPG") ||
          EndsWith(upper, ".PCX") || EndsWith(upper, ".GIF") || upper == "MYPIC" ||
-         upper == "CONTENTS.TXT";
+         upper == "CONTENTS.TXT" || EndsWith(upper, ".PARTIAL");
 }
 
 bool IsSaveFile(std::string_view name) { return EndsWith(Upper(name), ".SVE"); }

@@ -1,6 +1,7 @@
 #include "library/grid_builder.h"
 
 #include "base/names.h"
+#include "library/keeping.h"
 
 #include <map>
 
@@ -8,7 +9,8 @@ namespace fs = std::filesystem;
 
 bool IsReservedFolder(std::string_view name) {
   const std::string upper = Upper(name);
-  return upper == "AUTOSCRIPTS" || upper == "SKINFOLDER" || upper == "UNUSED";
+  return upper == "AUTOSCRIPTS" || upper == "SKINFOLDER" || upper == "UNUSED" ||
+         upper == Upper(kKeepingFolder);
 }
 
 void BuildFolderRows(FolderGrid &grid, const std::vector<std::string> &codes,

@@ -7,7 +7,8 @@
 #include <string_view>
 #include <vector>
 
-// Whether a library folder name is reserved ("AUTOSCRIPTS", "SKINFOLDER", "UNUSED", any case).
+// Whether a library folder name is reserved ("AUTOSCRIPTS", "SKINFOLDER", "UNUSED" and the
+// program's own keeping folder, any case).
 bool IsReservedFolder(std::string_view name);
 // Replaces the grid's folder rows: for each category letter in file order, every library folder
 // whose name starts with that letter, in name order. The header row stays.

@@ -1,5 +1,7 @@
 #include "library/grid_click.h"
 
+#include "base/existence.h"
+#include "library/keeping.h"
 #include "library/loaded_record.h"
 #include "library/move_in.h"
 #include "library/move_out.h"
@@ -39,24 +41,42 @@ int LastLoaded(const FolderGrid &grid, char letter) {
   return 0;
 }
 
+// Loads the folder of `row` and marks it loaded, even when some files could not be copied: those
+// that were can still be unloaded. Returns the loaded folders whose files it replaced.
+std::vector<std::string> Load(LibraryState &state, int row, Caption &caption, Failures &failures) {
+  const size_t before = failures.Lines().size();
+  const std::vector<std::string> overwritten =
+      MoveIn(state, state.Unigrid.Row(row).path, caption, failures);
+  MarkLoaded(state, row);
+  SaveLoaded(state, failures);
+  if (!state.Ready)
+    return overwritten;
+  Journal::Remove(KeepingFolder(state.LibDir));
+  if (failures.Lines().size() > before)
+    failures.SetHeading("\"" + state.Unigrid.Row(row).name +
+                        "\" is only partly loaded: the files below are missing from the game. "
+                        "Free some disk space, or close the game if it is running, then unload "
+                        "the folder and load it again.");
+  return overwritten;
+}
+
 // At most one campaign is loaded; loading another first unloads the loaded one, which carries
 // the save files home into its folder.
-void ClickCampaign(LibraryState &state, int clicked, Caption &caption, Failures &failures) {
+std::vector<std::string> ClickCampaign(LibraryState &state, int clicked, Caption &caption,
+                                       Failures &failures) {
   const fs::path folder = state.Unigrid.Row(clicked).path;
   if (IsLoaded(state.Unigrid.Row(clicked))) {
     MarkNotLoaded(state, clicked);
     MoveOut(state, folder, caption, failures);
     SaveLoaded(state, failures);
-    return;
+    return {};
   }
   const int other = FirstLoaded(state.Unigrid, kCampaign);
   if (other != 0) {
     MarkNotLoaded(state, other);
     MoveOut(state, state.Unigrid.Row(other).path, caption, failures);
   }
-  MarkLoaded(state, clicked);
-  MoveIn(state, folder, caption, failures);
-  SaveLoaded(state, failures);
+  return Load(state, clicked, caption, failures);
 }
 
 void ShowPlaneSets(LibraryState &state, const fs::path &folder, Failures &failures) {
@@ -68,7 +88,8 @@ void ShowPlaneSets(LibraryState &state, const fs::path &folder, Failures &failur
   state.Slots.frameVisible = planeSetFound;
 }
 
-void ClickOther(LibraryState &state, int clicked, Caption &caption, Failures &failures) {
+std::vector<std::string> ClickOther(LibraryState &state, int clicked, Caption &caption,
+                                    Failures &failures) {
   const char letter = Letter(state.Unigrid.Row(clicked));
   if (IsLoaded(state.Unigrid.Row(clicked))) {
     Udel(state, clicked, caption, failures);
@@ -77,34 +98,41 @@ void ClickOther(LibraryState &state, int clicked, Caption &caption, Failures &fa
       state.Slots.frameVisible = false;
     }
     SaveLoaded(state, failures);
-    return;
+    return {};
   }
   const int other = AllowsSeveralLoaded(letter) ? 0 : LastLoaded(state.Unigrid, letter);
   if (other != 0) {
     if (letter == kFlightModel)
       state.Slots.frameVisible = false;
-    state.Unigrid.ColourRow(other, state.GridBackColor);
+    // Unmarked first, so that the record written by the unload no longer names it.
+    MarkNotLoaded(state, other);
     MoveOut(state, state.Unigrid.Row(other).path, caption, failures);
-    state.Unigrid.Row(other).mark.clear();
   }
-  const fs::path folder = state.Unigrid.Row(clicked).path;
-  MoveIn(state, folder, caption, failures);
-  MarkLoaded(state, clicked);
-  SaveLoaded(state, failures);
+  const std::vector<std::string> overwritten = Load(state, clicked, caption, failures);
   if (letter == kFlightModel)
-    ShowPlaneSets(state, folder, failures);
+    ShowPlaneSets(state, state.Unigrid.Row(clicked).path, failures);
+  return overwritten;
 }
 
 } // namespace
 
-void ClickRow(LibraryState &state, int row, Caption &caption, Failures &failures) {
+std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption,
+                                  Failures &failures) {
   state.Unigrid.currentRow = row;
   if (!state.Unigrid.IsFolderRow(row))
-    return;
-  if (Letter(state.Unigrid.Row(row)) == kCampaign)
-    ClickCampaign(state, row, caption, failures);
-  else
-    ClickOther(state, row, caption, failures);
+    return {};
+  const GridRow &clicked = state.Unigrid.Row(row);
+  if (state.Ready && !IsLoaded(clicked)) {
+    FolderCheck(clicked.path);
+    if (!FolderFound) {
+      failures.Add(clicked.path, "is no longer in the library, so nothing was loaded "
+                                 "(\"Refresh!\" shows the library as it is now)");
+      return {};
+    }
+  }
+  if (Letter(clicked) == kCampaign)
+    return ClickCampaign(state, row, caption, failures);
+  return ClickOther(state, row, caption, failures);
 }
 
 void PressKeyOnRow(LibraryState &state, int row, int key, Caption &caption, Failures &failures) {

@@ -4,13 +4,19 @@
 #include "base/failures.h"
 #include "library/library_state.h"
 
+#include <string>
+#include <vector>
+
 // The key code of Enter.
 inline constexpr int kEnterKey = 13;
 
 // A click on grid row `row`, which becomes the current row: loads a folder that is not loaded,
 // unloads one that is, keeping the campaign and single-selection rules, and drives the slot grid
-// for flight-model folders. A click on the header row or past the grid is ignored. While `Ready`
-// is false it only marks and colours rows: no file is copied, deleted or moved.
-void ClickRow(LibraryState &state, int row, Caption &caption, Failures &failures);
+// for flight-model folders. A click on the header row or past the grid is ignored, and so is one
+// on a folder that is no longer in the library (said in `failures`). While `Ready` is false it
+// only marks and colours rows: no file is copied, deleted or moved. Returns the loaded folders
+// whose files the load replaced.
+std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption,
+                                  Failures &failures);
 // A key pressed on grid row `row`: Enter acts as a click on it, other keys do nothing.
 void PressKeyOnRow(LibraryState &state, int row, int key, Caption &caption, Failures &failures);

@@ -5,6 +5,8 @@
 #include "base/names.h"
 #include "base/text_file.h"
 
+#include <algorithm>
+
 namespace fs = std::filesystem;
 
 fs::path RecordPath(const LibraryState &state) {
@@ -36,6 +38,19 @@ std::vector<std::string> ReadLoadedNames(const LibraryState &state, Failures &fa
         names.push_back(std::move(line));
   }
   return names;
+}
+
+void SetRecorded(const LibraryState &state, const std::string &name, bool loaded,
+                 Failures &failures) {
+  std::vector<std::string> names = ReadLoadedNames(state, failures);
+  const auto found = std::find(names.begin(), names.end(), name);
+  if ((found != names.end()) == loaded)
+    return;
+  if (loaded)
+    names.push_back(name);
+  else
+    names.erase(std::remove(names.begin(), names.end(), name), names.end());
+  WriteAtomically(RecordPath(state), JoinCrLf(names) + "\r\n", failures);
 }
 
 void EnsureRecord(const LibraryState &state, Failures &failures) {

@@ -15,5 +15,9 @@ std::string RecordText(const FolderGrid &grid);
 void SaveLoaded(LibraryState &state, Failures &failures);
 // The record's non-empty lines; a missing or unreadable record gives none.
 std::vector<std::string> ReadLoadedNames(const LibraryState &state, Failures &failures);
+// Adds `name` to the record on disk or takes it out, for an operation that was interrupted
+// before the record followed it.
+void SetRecorded(const LibraryState &state, const std::string &name, bool loaded,
+                 Failures &failures);
 // Creates the record as an empty file when it is missing.
 void EnsureRecord(const LibraryState &state, Failures &failures);

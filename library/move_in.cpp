@@ -5,15 +5,28 @@
 #include "base/names.h"
 #include "library/file_rules.h"
 #include "library/game_places.h"
+#include "library/keeping.h"
+
+#include <set>
 
 namespace fs = std::filesystem;
 
-void MoveIn(const LibraryState &state, const fs::path &folder, Caption &caption,
-            Failures &failures) {
-  if (!state.Ready || folder == state.EAWDir)
-    return;
-  CaptionRestorer restorer(caption);
-  GamePlaces places(state.EAWDir);
+namespace {
+
+// One file of the folder being loaded and where it goes.
+struct Copy {
+  fs::path source;
+  Journal::Entry entry;
+};
+
+// The copies a load makes, with the game's own files among their targets marked to be kept;
+// notes in `overwritten` the loaded folders whose files it replaces.
+std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
+                             const Ledger &ledger, GamePlaces &places,
+                             std::set<std::string> &overwritten, Failures &failures) {
+  const fs::path keeping = KeepingFolder(state.LibDir);
+  const auto providers = ledger.LastProviders();
+  std::vector<Copy> copies;
   for (const std::string &name : ListFiles(folder)) {
     if (StaysInLibrary(name))
       continue;
@@ -23,11 +36,60 @@ void MoveIn(const LibraryState &state, const fs::path &folder, Caption &caption,
       failures.Add(source, "not copied, its game folder is missing");
       continue;
     }
-    NameIndex &index = places.Index(place);
-    const std::string target = index.TargetName(name);
-    if (!CopyReplacing(source, Child(places.Folder(place), target), failures))
-      continue;
-    index.Add(target);
-    caption.Set("Please wait- copying: :" + name);
+    const NameIndex &index = places.Index(place);
+    const PlacedFile target{place, index.TargetName(name)};
+    const auto provider = providers.find(PlaceKey(place, target.name));
+    bool keep = false;
+    // A copy this folder made before (a ledger out of step with the record) is no original.
+    if (provider != providers.end() && provider->second != NameText(folder))
+      overwritten.insert(provider->second);
+    else if (provider == providers.end() && !index.Matches(name).empty())
+      keep = !fs::exists(OriginalPath(keeping, target));
+    copies.push_back({source, {target, keep}});
   }
+  return copies;
+}
+
+} // namespace
+
+std::vector<std::string> MoveIn(const LibraryState &state, const fs::path &folder, Caption &caption,
+                                Failures &failures) {
+  if (!state.Ready || folder == state.EAWDir)
+    return {};
+  CaptionRestorer restorer(caption);
+  const fs::path keeping = KeepingFolder(state.LibDir);
+  Ledger ledger = Ledger::Read(keeping, failures);
+  const std::string name = NameText(folder);
+  GamePlaces places(state.EAWDir);
+  std::set<std::string> overwritten;
+  const std::vector<Copy> copies = PlanCopies(state, folder, ledger, places, overwritten, failures);
+  ledger.Remove(name);
+  Journal journal{Journal::Step::Load, name, {}};
+  for (const Copy &copy : copies)
+    journal.entries.push_back(copy.entry);
+  if (!journal.Write(keeping, failures)) {
+    failures.Add(folder, "was not loaded: the program cannot note what it is doing in " +
+                             DisplayPath(keeping));
+    return {};
+  }
+  LoadedFolder loaded{name, {}};
+  for (const Copy &copy : copies) {
+    const PlacedFile &target = copy.entry.file;
+    const fs::path destination = Child(places.Folder(target.place), target.name);
+    // The game's own file goes into safekeeping first; one that cannot is not overwritten.
+    if (copy.entry.keepOriginal &&
+        !MoveReplacing(destination, OriginalPath(keeping, target), failures))
+      continue;
+    if (!CopyReplacing(copy.source, destination, failures))
+      continue;
+    places.Index(target.place).Add(target.name);
+    loaded.files.push_back(target);
+    caption.Set("Please wait- copying: :" + NameText(copy.source));
+  }
+  ledger.Append(std::move(loaded));
+  ledger.Write(keeping, failures);
+  journal.step = Journal::Step::Loaded;
+  journal.entries.clear();
+  journal.Write(keeping, failures);
+  return {overwritten.begin(), overwritten.end()};
 }

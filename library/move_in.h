@@ -5,10 +5,15 @@
 #include "library/library_state.h"
 
 #include <filesystem>
+#include <string>
+#include <vector>
 
 // Loads the add-on folder `folder`: copies each of its files that does not stay in the library to
 // the game folder, "Savedata" or "Music", replacing a file of that name, and shows each copied
-// name in the caption. Does nothing while `Ready` is false or when `folder` is the game folder.
-// A file that cannot be copied is skipped and recorded in `failures`.
-void MoveIn(const LibraryState &state, const std::filesystem::path &folder, Caption &caption,
-            Failures &failures);
+// name in the caption. A game file that no loaded folder put there is first moved into the
+// keeping folder, to be put back when the last folder providing its name is unloaded. The
+// journal is left at "loaded" for the caller to close once the record is written. Does nothing
+// while `Ready` is false or when `folder` is the game folder. A file that cannot be copied is
+// skipped and recorded in `failures`. Returns the loaded folders whose files it replaced.
+std::vector<std::string> MoveIn(const LibraryState &state, const std::filesystem::path &folder,
+                                Caption &caption, Failures &failures);

@@ -5,41 +5,56 @@
 #include "base/names.h"
 #include "library/file_rules.h"
 #include "library/game_places.h"
+#include "library/keeping.h"
 #include "library/loaded_record.h"
 #include "library/save_files.h"
+#include "library/unplace.h"
 
 namespace fs = std::filesystem;
 
-static void DeleteCopies(const fs::path &eawDir, const fs::path &folder, Caption &caption,
-                         Failures &failures) {
-  CaptionRestorer restorer(caption);
+// The copies that a folder loaded before the ledger was kept made: its files now, where exactly
+// one game file has the name in any case.
+static std::vector<Journal::Entry> ListedCopies(const fs::path &eawDir, const fs::path &folder) {
+  std::vector<Journal::Entry> entries;
   GamePlaces places(eawDir);
   for (const std::string &name : ListFiles(folder)) {
-    // Save files stay: a campaign's have just been carried home, any other folder's are kept.
     if (StaysInLibrary(name) || IsSaveFile(name))
       continue;
     const Place place = PlaceOf(name);
-    NameIndex &index = places.Index(place);
-    const std::vector<std::string> &matches = index.Matches(name);
-    if (matches.size() != 1)
-      continue;
-    const std::string found = matches.front();
-    const fs::path target = Child(places.Folder(place), found);
-    caption.Set("Deleting " + found);
-    if (RemoveFile(target, failures))
-      index.Remove(found);
+    const std::vector<std::string> &matches = places.Index(place).Matches(name);
+    if (matches.size() == 1)
+      entries.push_back({{place, matches.front()}, false});
   }
+  return entries;
 }
 
 void MoveOut(LibraryState &state, const fs::path &folder, Caption &caption, Failures &failures) {
   if (!state.Ready)
     return;
-  if (IsCampaignPath(folder))
+  if (IsCampaignFolder(folder))
     CarrySaveFiles(state.EAWDir, folder, failures);
   if (folder == state.EAWDir)
     return;
-  DeleteCopies(state.EAWDir, folder, caption, failures);
+  CaptionRestorer restorer(caption);
+  const fs::path keeping = KeepingFolder(state.LibDir);
+  Ledger ledger = Ledger::Read(keeping, failures);
+  const std::string name = NameText(folder);
+  Journal journal{Journal::Step::Unload, name, {}};
+  if (const LoadedFolder *loaded = ledger.Find(name))
+    for (const PlacedFile &file : loaded->files)
+      journal.entries.push_back({file, false});
+  else
+    journal.entries = ListedCopies(state.EAWDir, folder);
+  ledger.Remove(name);
+  if (!journal.Write(keeping, failures)) {
+    failures.Add(folder, "was not unloaded: the program cannot note what it is doing in " +
+                             DisplayPath(keeping));
+    return;
+  }
+  UnplaceFiles(state, ledger, journal.entries, caption, failures);
+  ledger.Write(keeping, failures);
   SaveLoaded(state, failures);
+  Journal::Remove(keeping);
 }
 
 void Udel(LibraryState &state, int row, Caption &caption, Failures &failures) {

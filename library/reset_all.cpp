@@ -1,9 +1,12 @@
 #include "library/reset_all.h"
 
+#include "base/existence.h"
 #include "base/file_ops.h"
 #include "base/listing.h"
 #include "base/names.h"
 #include "base/text_file.h"
+#include "library/game_places.h"
+#include "library/keeping.h"
 #include "library/loaded_record.h"
 
 namespace fs = std::filesystem;
@@ -42,8 +45,47 @@ void DeleteFiles(const fs::path &folder, const std::vector<std::string> &names,
     RemoveFile(Child(folder, name), failures);
 }
 
-void CleanUp(const LibraryState &state, Failures &failures) {
-  DeleteFiles(state.EAWDir, CleanUpNames(state, failures), failures);
+void CleanUp(const LibraryState &state, const std::vector<std::string> &names, Failures &failures) {
+  std::vector<std::string> present;
+  for (const std::string &name : names) {
+    FileCheck(Child(state.EAWDir, name));
+    if (FileFound)
+      present.push_back(name);
+  }
+  DeleteFiles(state.EAWDir, present, failures);
+}
+
+void RestoreOriginals(const LibraryState &state, Failures &failures) {
+  const fs::path keeping = KeepingFolder(state.LibDir);
+  GamePlaces places(state.EAWDir);
+  for (const Place place : {Place::Game, Place::Savedata, Place::Music}) {
+    const fs::path kept = OriginalsFolder(keeping, place);
+    for (const std::string &name : ListFiles(kept)) {
+      const fs::path target = Child(places.Folder(place), name);
+      // A saved game of that name is the player's progress since: both stay.
+      FileCheck(target);
+      if (IsSaveFile(name) && FileFound)
+        continue;
+      MoveReplacing(Child(kept, name), target, failures);
+    }
+  }
+}
+
+void FinishReset(LibraryState &state, Journal journal, Failures &failures) {
+  const fs::path keeping = KeepingFolder(state.LibDir);
+  if (journal.step == Journal::Step::Reset) {
+    std::vector<std::string> names;
+    for (const Journal::Entry &entry : journal.entries)
+      names.push_back(entry.file.name);
+    CleanUp(state, names, failures);
+    journal.step = Journal::Step::Restore;
+    journal.entries.clear();
+    journal.Write(keeping, failures);
+  }
+  RestoreOriginals(state, failures);
+  Ledger().Write(keeping, failures);
+  WriteAtomically(RecordPath(state), "", failures);
+  Journal::Remove(keeping);
 }
 
 // The record is now empty, so no row may stay marked: a later click would write it back.
@@ -55,13 +97,20 @@ static void UnmarkAllRows(LibraryState &state) {
   state.Slots.frameVisible = false;
 }
 
-void ResetAll(LibraryState &state, Caption &caption, Failures &failures) {
+void ResetAll(LibraryState &state, const std::vector<std::string> &names, Caption &caption,
+              Failures &failures) {
   {
     CaptionRestorer restorer(caption);
     state.Ready = true;
     caption.Set("Please wait... cleaning up");
-    CleanUp(state, failures);
-    WriteAtomically(RecordPath(state), "", failures);
+    Journal journal{Journal::Step::Reset, "", {}};
+    for (const std::string &name : names)
+      journal.entries.push_back({{Place::Game, name}, false});
+    if (journal.Write(KeepingFolder(state.LibDir), failures))
+      FinishReset(state, std::move(journal), failures);
+    else
+      failures.Add("Nothing was reset: the program cannot note what it is doing in " +
+                   DisplayPath(KeepingFolder(state.LibDir)));
   }
   UnmarkAllRows(state);
   state.Ready = true;

@@ -2,6 +2,7 @@
 
 #include "base/caption.h"
 #include "base/failures.h"
+#include "library/keeping.h"
 #include "library/library_state.h"
 
 #include <filesystem>
@@ -23,7 +24,16 @@ std::vector<std::string> CleanUpNames(const LibraryState &state, Failures &failu
 // Deletes each named file of `folder`; one that cannot be deleted is skipped and recorded.
 void DeleteFiles(const std::filesystem::path &folder, const std::vector<std::string> &names,
                  Failures &failures);
-// Deletes the add-on files from the game folder.
-void CleanUp(const LibraryState &state, Failures &failures);
-// "Reset All": cleans up the game folder, empties the record and shows every row unloaded.
-void ResetAll(LibraryState &state, Caption &caption, Failures &failures);
+// Deletes the named add-on files (found by CleanUpNames) that are still in the game folder.
+void CleanUp(const LibraryState &state, const std::vector<std::string> &names, Failures &failures);
+// Puts every original in the keeping folder back into the game; a saved game of the same name
+// that the game has again stays, and so does its original.
+void RestoreOriginals(const LibraryState &state, Failures &failures);
+// Ends a Reset All noted in `journal`: deletes its files unless that was done, puts the originals
+// back, empties the ledger and the record and closes the journal. Also ends one that was
+// interrupted.
+void FinishReset(LibraryState &state, Journal journal, Failures &failures);
+// "Reset All" of the files `names` the player agreed to: cleans up the game folder, puts the
+// kept originals back, empties the record and shows every row unloaded.
+void ResetAll(LibraryState &state, const std::vector<std::string> &names, Caption &caption,
+              Failures &failures);

@@ -10,13 +10,9 @@
 
 namespace fs = std::filesystem;
 
-bool IsCampaignPath(const fs::path &folder) {
-  for (const fs::path &part : folder) {
-    const std::string name = NameText(part);
-    if (StartsWith(name, "C ") || StartsWith(name, "C-"))
-      return true;
-  }
-  return false;
+bool IsCampaignFolder(const fs::path &folder) {
+  const std::string name = NameText(folder);
+  return StartsWith(name, "C ") || StartsWith(name, "C-");
 }
 
 void CarrySaveFiles(const fs::path &eawDir, const fs::path &campaign, Failures &failures) {

@@ -4,9 +4,9 @@
 
 #include <filesystem>
 
-// Whether `folder` is a campaign folder or lies inside one: a component of its path starts with
-// "C " or "C-" (case-sensitive).
-bool IsCampaignPath(const std::filesystem::path &folder);
+// Whether `folder` is a campaign folder: its own name starts with "C " or "C-" (case-sensitive);
+// the folders above it do not count.
+bool IsCampaignFolder(const std::filesystem::path &folder);
 // Moves every save file ("*.sve") of the game's "Savedata" into `campaign`: each is deleted from
 // "Savedata" only after its copy is complete. A file that cannot be moved stays where it is and is
 // recorded in `failures`; the others are still moved.

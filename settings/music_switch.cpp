@@ -1,36 +1,40 @@
 #include "settings/music_switch.h"
 
 #include "base/existence.h"
+#include "base/file_ops.h"
 #include "base/names.h"
+#include "base/text_file.h"
 #include "settings/music_sets.h"
 
+#include <optional>
 #include <system_error>
 
 namespace fs = std::filesystem;
 
-// Renames the folder `from` to `to`, refusing a target that exists in any letter case (a plain
-// rename would silently replace an empty folder there).
-static bool RenameFolder(const fs::path &from, const fs::path &to, Failures &failures) {
+// Why `from` cannot become `to`, or nothing: it must be a folder, and no entry but `from` and
+// `leaving` (renamed away first) may have the name `to` in any letter case: a plain rename would
+// replace an empty folder there, and the game could not tell two such folders apart.
+static std::optional<std::string> RenameRefusal(const fs::path &from, const fs::path &to,
+                                                const fs::path &leaving = {}) {
   FolderCheck(from);
-  if (!FolderFound) {
-    failures.Add(from, "cannot be renamed: there is no such folder");
-    return false;
-  }
+  if (!FolderFound)
+    return DisplayPath(from) + " is no folder";
+  for (const fs::path &entry : EntriesAnyCase(to.parent_path(), NameText(to)))
+    if (entry != from && entry != leaving)
+      return DisplayPath(entry) + " is in the way";
+  return std::nullopt;
+}
+
+static bool Rename(const fs::path &from, const fs::path &to, Failures &failures) {
   std::error_code error;
-  if (fs::exists(FindAnyCase(to.parent_path(), NameText(to)), error)) {
-    failures.Add(from, "cannot be renamed: " + DisplayPath(to) + " already exists");
-    return false;
-  }
   fs::rename(from, to, error);
-  if (error) {
+  if (error)
     failures.Add(from, "cannot be renamed to " + DisplayPath(to) + " (" + error.message() + ")");
-    return false;
-  }
-  return true;
+  return !error;
 }
 
 bool SwitchMusic(const fs::path &eawDir, const std::string &activeName,
-                 const std::string &chosenName, Failures &failures) {
+                 const std::string &chosenName, const fs::path &journal, Failures &failures) {
   if (!IsMusicSetName(activeName)) {
     failures.Add("The music was not switched: no current music set is known (every set listed "
                  "in Music.ini has a folder of its own).");
@@ -42,11 +46,43 @@ bool SwitchMusic(const fs::path &eawDir, const std::string &activeName,
   }
   const fs::path music = FindAnyCase(eawDir, "Music");
   const fs::path active = Child(eawDir, activeName);
-  if (!RenameFolder(music, active, failures))
+  const fs::path chosen = FindAnyCase(eawDir, chosenName);
+  // Every refusal is decided before the first rename, so that a refused switch changes nothing.
+  std::optional<std::string> refusal = RenameRefusal(music, active);
+  if (!refusal)
+    refusal = RenameRefusal(chosen, Child(eawDir, "Music"), music);
+  if (refusal) {
+    failures.Add("The music was not switched: " + *refusal + ".");
     return false;
-  if (RenameFolder(FindAnyCase(eawDir, chosenName), music, failures))
-    return true;
-  if (!RenameFolder(active, music, failures))
-    failures.Add(active, "holds the game's music; rename it to \"Music\" by hand");
-  return false;
+  }
+  std::error_code error;
+  fs::create_directories(journal.parent_path(), error);
+  if (!WriteAtomically(journal, JoinCrLf({NameText(music), activeName, NameText(chosen)}),
+                       failures))
+    return false;
+  bool switched = false;
+  if (Rename(music, active, failures)) {
+    switched = Rename(chosen, music, failures);
+    if (!switched && !Rename(active, music, failures))
+      failures.Add(active, "holds the game's music; rename it to \"Music\" by hand");
+  }
+  fs::remove(journal, error);
+  return switched;
+}
+
+void FinishMusicSwitch(const fs::path &eawDir, const fs::path &journal, Failures &failures) {
+  const auto lines = ReadLinesIfExists(journal, failures);
+  std::error_code error;
+  fs::remove(PartialPath(journal), error);
+  if (!lines)
+    return;
+  if (lines->size() == 3) {
+    const fs::path music = Child(eawDir, (*lines)[0]);
+    FolderCheck(FindAnyCase(eawDir, "Music"));
+    if (!FolderFound) {
+      FolderCheck(Child(eawDir, (*lines)[2]));
+      Rename(Child(eawDir, FolderFound ? (*lines)[2] : (*lines)[1]), music, failures);
+    }
+  }
+  fs::remove(journal, error);
 }

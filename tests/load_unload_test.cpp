@@ -105,10 +105,11 @@ TEST(MoveOut, DeletesOnlyTheCopiesLoadingMade) {
   EXPECT_EQ(game.folder.Record(), "\r\n");
 }
 
-TEST(MoveOut, CampaignIsNamedByCAndABlankOrHyphen) {
-  EXPECT_TRUE(IsCampaignPath("/games/ZEP128/C-War"));
-  EXPECT_TRUE(IsCampaignPath("/games/ZEP128/C War"));
-  EXPECT_TRUE(IsCampaignPath("/C-games/eaw/ZEP128/S-Sky"));
-  EXPECT_FALSE(IsCampaignPath("/games/ZEP128/Cwar"));
-  EXPECT_FALSE(IsCampaignPath("/games/ZEP128/c-war"));
+TEST(MoveOut, CampaignIsNamedByCAndABlankOrHyphenInItsOwnName) {
+  EXPECT_TRUE(IsCampaignFolder("/games/ZEP128/C-War"));
+  EXPECT_TRUE(IsCampaignFolder("/games/ZEP128/C War"));
+  // A game installed below a folder named like a campaign keeps its saved games on unload.
+  EXPECT_FALSE(IsCampaignFolder("/C-games/eaw/ZEP128/S-Sky"));
+  EXPECT_FALSE(IsCampaignFolder("/games/ZEP128/Cwar"));
+  EXPECT_FALSE(IsCampaignFolder("/games/ZEP128/c-war"));
 }

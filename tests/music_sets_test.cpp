@@ -16,6 +16,8 @@ void MakeThreeSets(const TestFolder &game) {
   game.Write("Music/a.bgm", "3");
 }
 
+std::filesystem::path Journal(const TestFolder &game) { return game.Path() / "ZEP128/journal"; }
+
 void ExpectUntouched(const TestFolder &game) {
   EXPECT_EQ(game.Read("Set1/a.bgm") + game.Read("Set2/a.bgm") + game.Read("Music/a.bgm"), "123");
   EXPECT_FALSE(game.Exists("Set3"));
@@ -43,10 +45,11 @@ TEST(MusicSets, AFailedSwitchChangesNoFolderAndSaysSo) {
   MakeThreeSets(game);
   game.Write("NotAFolder", "file");
   Failures failures;
-  EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "NotAFolder", failures)); // second rename fails
-  EXPECT_FALSE(SwitchMusic(game.Path(), "", "Set1", failures));
-  EXPECT_FALSE(SwitchMusic(game.Path(), "Set2", "Set1", failures)); // Set2 is taken
-  EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "..", failures));
+  EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "NotAFolder", Journal(game),
+                           failures)); // second rename fails
+  EXPECT_FALSE(SwitchMusic(game.Path(), "", "Set1", Journal(game), failures));
+  EXPECT_FALSE(SwitchMusic(game.Path(), "Set2", "Set1", Journal(game), failures)); // Set2 is taken
+  EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "..", Journal(game), failures));
   EXPECT_EQ(failures.Lines().size(), 4u);
   ExpectUntouched(game);
 }

@@ -42,7 +42,7 @@ TEST_F(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
   state.Ready = false;
 
   for (int time = 0; time < 2; ++time) {
-    ::ResetAll(state, caption, failures);
+    ::ResetAll(state, CleanUpNames(state, failures), caption, failures);
     EXPECT_EQ(ListFiles(game.Path()),
               (Names{"chatline.txt", "dsg.ico", "eaw.exe", "Extra.Spt", "hof.dat", "title.bmp"}));
     for (const char *kept : {"Savedata/a.dat", "old.dat/inside.txt", "ZEP128/S-Camo/a.txt"})

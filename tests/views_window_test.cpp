@@ -76,7 +76,7 @@ TEST(ViewsWindow, RefreshRereadsTheLibraryAndKeepsLoadedRowsGreen) {
   EXPECT_EQ(game.Record(), "S-keep\r\n\r\n");
 }
 
-TEST(ViewsWindow, ResetAllDeletesAddOnFilesAndUnmarksEveryRow) {
+TEST(ViewsWindow, ResetAllAsksThenDeletesAddOnFilesAndUnmarksEveryRow) {
   GameFolder game;
   game.WithCategories("Skins: S\r\n");
   game.Write("ZEP128/S-one/planes.dat");
@@ -86,7 +86,14 @@ TEST(ViewsWindow, ResetAllDeletesAddOnFilesAndUnmarksEveryRow) {
   WindowDriver driver(game.Path());
   driver.ClickRow(1);
   ASSERT_TRUE(game.Exists("planes.dat"));
-  QTest::mouseClick(driver.Find<QPushButton>("Command1"), Qt::LeftButton);
+  auto *resetAll = driver.Find<QPushButton>("Command1");
+  EXPECT_EQ(driver.AnswerNextBox(QMessageBox::Cancel,
+                                 [&] { QTest::mouseClick(resetAll, Qt::LeftButton); }),
+            "Reset All will delete 3 files from the game folder, and put back the game's own "
+            "files that add-ons replaced:\npic1.bmp\nplanes.dat\nreadme.txt");
+  EXPECT_TRUE(game.Exists("readme.txt"));
+  EXPECT_EQ(driver.Grid()->model()->index(0, 2).data().toString(), "S");
+  driver.AnswerNextBox(QMessageBox::Ok, [&] { QTest::mouseClick(resetAll, Qt::LeftButton); });
   for (const char *gone : {"planes.dat", "readme.txt", "pic1.bmp"})
     EXPECT_FALSE(game.Exists(gone)) << gone;
   for (const char *kept : {"hof.dat", "chatline.txt", "title.bmp", "dsg.ico", "eaw.exe"})

@@ -3,6 +3,7 @@
 #include <QApplication>
 #include <QMessageBox>
 #include <QTest>
+#include <QTimer>
 
 WindowDriver::WindowDriver(const std::filesystem::path &eawDir)
     : window_(std::make_unique<MainWindow>(eawDir)),
@@ -22,6 +23,20 @@ void WindowDriver::ClickRow(int row, int column) {
 }
 
 void WindowDriver::PressGridKey(int key) { QTest::keyClick(Grid(), static_cast<Qt::Key>(key)); }
+
+QString WindowDriver::AnswerNextBox(QMessageBox::StandardButton button,
+                                    const std::function<void()> &action) {
+  QString text;
+  QTimer::singleShot(0, [&] {
+    auto *box = qobject_cast<QMessageBox *>(QApplication::activeModalWidget());
+    if (!box)
+      return;
+    text = box->text();
+    box->button(button)->click();
+  });
+  action();
+  return text;
+}
 
 QStringList WindowDriver::TakeMessages() {
   QApplication::processEvents();

@@ -3,8 +3,10 @@
 #include "ui/main_window.h"
 
 #include <QAbstractItemModelTester>
+#include <QMessageBox>
 #include <QStringList>
 #include <QTableView>
+#include <functional>
 #include <memory>
 
 // A started main window for a game folder, and the few ways a person works it.
@@ -21,6 +23,8 @@ public:
   void ClickRow(int row, int column = 1);
   // Types a key into the folder grid.
   void PressGridKey(int key);
+  // Does `action`, which opens a modal box, answers the box with `button` and returns its text.
+  QString AnswerNextBox(QMessageBox::StandardButton button, const std::function<void()> &action);
   // The texts of the message boxes the window has shown since the last call; closes them.
   QStringList TakeMessages();
 

@@ -5,22 +5,59 @@
 
 #include <QMessageBox>
 
+namespace {
+
+// A long list shows its first lines; the whole list is under "Show Details".
+constexpr size_t kShownLines = 12;
+
+// A box with `heading`, the first of `lines`, and all of them under "Show Details".
+QMessageBox *ListBox(QWidget *parent, QMessageBox::Icon icon, const std::string &heading,
+                     const std::vector<std::string> &lines, QMessageBox::StandardButtons buttons) {
+  QString text = FromName(heading);
+  for (size_t i = 0; i < lines.size() && i < kShownLines; ++i)
+    text += "\n" + FromName(lines[i]);
+  if (lines.size() > kShownLines) {
+    text += QString("\n... and %1 more.").arg(lines.size() - kShownLines);
+    QString details = FromName(heading);
+    for (const std::string &line : lines)
+      details += "\n" + FromName(line);
+    auto *box = new QMessageBox(icon, WindowCaptionText().simplified(), text, buttons, parent);
+    box->setDetailedText(details);
+    return box;
+  }
+  return new QMessageBox(icon, WindowCaptionText().simplified(), text, buttons, parent);
+}
+
+} // namespace
+
 void ShowFailures(QWidget *parent, const Failures &failures, const QString &heading) {
   if (failures.Empty())
     return;
-  // A disk that fails half-way through a big folder names every file; the box shows the first
-  // few and keeps the whole list under "Show Details".
-  constexpr size_t kShownLines = 12;
-  const std::vector<std::string> &lines = failures.Lines();
-  QString text = heading;
-  for (size_t i = 0; i < lines.size() && i < kShownLines; ++i)
-    text += "\n" + FromName(lines[i]);
-  auto *box = new QMessageBox(QMessageBox::Warning, WindowCaptionText().simplified(), text,
-                              QMessageBox::Ok, parent);
-  if (lines.size() > kShownLines) {
-    box->setText(text + QString("\n... and %1 more.").arg(lines.size() - kShownLines));
-    box->setDetailedText(FromName(failures.Message(heading.toStdString())));
-  }
+  QMessageBox *box =
+      ListBox(parent, QMessageBox::Warning, failures.HeadingOr(heading.toStdString()),
+              failures.Lines(), QMessageBox::Ok);
   box->setAttribute(Qt::WA_DeleteOnClose);
   box->open();
+}
+
+void ShowNotice(QWidget *parent, const std::string &notice) {
+  if (notice.empty())
+    return;
+  QMessageBox *box = ListBox(parent, QMessageBox::Information, notice, {}, QMessageBox::Ok);
+  box->setAttribute(Qt::WA_DeleteOnClose);
+  box->open();
+}
+
+bool ConfirmDeletion(QWidget *parent, const std::vector<std::string> &names) {
+  const std::string heading = "Reset All will delete " + std::to_string(names.size()) +
+                              (names.size() == 1 ? " file" : " files") +
+                              " from the game folder, and put back the game's own files that "
+                              "add-ons replaced:";
+  QMessageBox *box =
+      ListBox(parent, QMessageBox::Question, heading, names, QMessageBox::Ok | QMessageBox::Cancel);
+  box->setObjectName("ConfirmResetAll");
+  box->setDefaultButton(QMessageBox::Cancel);
+  const bool agreed = box->exec() == QMessageBox::Ok;
+  delete box;
+  return agreed;
 }

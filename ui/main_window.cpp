@@ -5,6 +5,7 @@
 #include "ui/event_hook.h"
 #include "ui/failure_box.h"
 #include "ui/folder_grid_model.h"
+#include "ui/input_blocker.h"
 #include "ui/picture.h"
 #include "ui/slot_grid_view.h"
 #include "ui/twips.h"
@@ -76,7 +77,9 @@ void MainWindow::WireHooks() {
       return false;
     auto *key = static_cast<QKeyEvent *>(event);
     if (key->key() == Qt::Key_Return || key->key() == Qt::Key_Enter) {
-      Unigrid_KeyPress(kEnterKey);
+      // Only a fresh press acts: a held key would load and unload the row by turns.
+      if (!key->isAutoRepeat())
+        Unigrid_KeyPress(kEnterKey);
       return true;
     }
     // Typed characters do nothing; arrow keys still move the current row.
@@ -147,7 +150,10 @@ void MainWindow::List3_Click(int k) {
 
 void MainWindow::Label33_Click() {
   Failures failures;
-  selector_.RefreshLibrary(failures);
+  {
+    const InputBlocker blocker;
+    selector_.RefreshLibrary(failures);
+  }
   ShowGridRows();
   ShowGridChanges();
   ShowFailures(this, failures, "Refresh could not do all:");
@@ -155,16 +161,27 @@ void MainWindow::Label33_Click() {
 
 void MainWindow::Command1_Click() {
   Failures failures;
-  selector_.ResetAll(failures);
+  const std::vector<std::string> names = selector_.ResetAllFiles(failures);
+  if (!names.empty() && !ConfirmDeletion(this, names))
+    return;
+  {
+    const InputBlocker blocker;
+    selector_.ResetAll(names, failures);
+  }
   ShowGridChanges();
   ShowFailures(this, failures, "Reset All could not delete these files:");
 }
 
 void MainWindow::Unigrid_Click(const QModelIndex &index) {
   Failures failures;
-  selector_.ClickRow(index.row() + 1, failures);
+  std::string notice;
+  {
+    const InputBlocker blocker;
+    notice = selector_.ClickRow(index.row() + 1, failures);
+  }
   ShowGridChanges();
   ShowFailures(this, failures, "Some files could not be handled:");
+  ShowNotice(this, notice);
 }
 
 void MainWindow::Unigrid_KeyPress(int key) {
@@ -172,9 +189,14 @@ void MainWindow::Unigrid_KeyPress(int key) {
   if (!current.isValid())
     return;
   Failures failures;
-  selector_.PressKey(current.row() + 1, key, failures);
+  std::string notice;
+  {
+    const InputBlocker blocker;
+    notice = selector_.PressKey(current.row() + 1, key, failures);
+  }
   ShowGridChanges();
   ShowFailures(this, failures, "Some files could not be handled:");
+  ShowNotice(this, notice);
 }
 
 void MainWindow::Unigrid_MouseMove(int row) {
@@ -252,7 +274,10 @@ void MainWindow::FillMusicList() {
 
 void MainWindow::List4_Click(QListWidgetItem *item) {
   Failures failures;
-  selector_.SwitchMusic(ToName(c_.Label11->text()), ToName(item->text()), failures);
+  {
+    const InputBlocker blocker;
+    selector_.SwitchMusic(ToName(c_.Label11->text()), ToName(item->text()), failures);
+  }
   FillMusicList();
   ShowFailures(this, failures, "The music could not be switched:");
 }

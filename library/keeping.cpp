@@ -1,0 +1,158 @@
+#include "library/keeping.h"
+
+#include "base/file_ops.h"
+#include "base/names.h"
+#include "base/text_file.h"
+
+#include <algorithm>
+#include <system_error>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+constexpr char kLedgerFile[] = "loaded.txt";
+constexpr char kJournalFile[] = "journal.txt";
+constexpr std::string_view kPlaceLetters = "GSM";
+constexpr std::string_view kSteps[] = {"load", "loaded", "unload", "reset", "restore"};
+
+char PlaceLetter(Place place) { return kPlaceLetters[static_cast<size_t>(place)]; }
+
+std::optional<Place> PlaceFromLetter(char letter) {
+  const size_t at = kPlaceLetters.find(letter);
+  if (at == std::string_view::npos)
+    return std::nullopt;
+  return static_cast<Place>(at);
+}
+
+// A name that a line can hold: one without line ends or a leading tab.
+bool Storable(std::string_view name) {
+  return !name.empty() && name.front() != '\t' && name.find_first_of("\r\n") == name.npos;
+}
+
+// A file line: a tab, the place letter, the keep mark and the name.
+std::string FileLine(const PlacedFile &file, char mark) {
+  return std::string("\t") + PlaceLetter(file.place) + mark + file.name;
+}
+
+std::optional<PlacedFile> ParseFileLine(const std::string &line) {
+  if (line.size() < 4 || line[0] != '\t')
+    return std::nullopt;
+  const std::optional<Place> place = PlaceFromLetter(line[1]);
+  if (!place)
+    return std::nullopt;
+  return PlacedFile{*place, line.substr(3)};
+}
+
+} // namespace
+
+std::string PlaceKey(Place place, std::string_view name) {
+  return PlaceLetter(place) + FoldName(name);
+}
+
+fs::path KeepingFolder(const fs::path &libDir) { return libDir / kKeepingFolder; }
+
+fs::path OriginalsFolder(const fs::path &keeping, Place place) {
+  return keeping / "originals" / std::string(1, PlaceLetter(place));
+}
+
+fs::path OriginalPath(const fs::path &keeping, const PlacedFile &file) {
+  return Child(OriginalsFolder(keeping, file.place), file.name);
+}
+
+Ledger Ledger::Read(const fs::path &keeping, Failures &failures) {
+  Ledger ledger;
+  RemovePartial(PartialPath(keeping / kLedgerFile));
+  const auto lines = ReadLinesIfExists(keeping / kLedgerFile, failures);
+  if (!lines)
+    return ledger;
+  for (const std::string &line : *lines) {
+    if (const std::optional<PlacedFile> file = ParseFileLine(line)) {
+      if (!ledger.folders_.empty())
+        ledger.folders_.back().files.push_back(*file);
+    } else if (Storable(line)) {
+      ledger.folders_.push_back({line, {}});
+    }
+  }
+  return ledger;
+}
+
+bool Ledger::Write(const fs::path &keeping, Failures &failures) const {
+  std::string text;
+  for (const LoadedFolder &folder : folders_) {
+    if (!Storable(folder.name))
+      continue;
+    text += folder.name + "\r\n";
+    for (const PlacedFile &file : folder.files)
+      if (Storable(file.name))
+        text += FileLine(file, ' ') + "\r\n";
+  }
+  std::error_code error;
+  fs::create_directories(keeping, error);
+  return WriteAtomically(keeping / kLedgerFile, text, failures);
+}
+
+const LoadedFolder *Ledger::Find(std::string_view name) const {
+  for (const LoadedFolder &folder : folders_)
+    if (folder.name == name)
+      return &folder;
+  return nullptr;
+}
+
+void Ledger::Remove(std::string_view name) {
+  folders_.erase(std::remove_if(folders_.begin(), folders_.end(),
+                                [&](const LoadedFolder &folder) { return folder.name == name; }),
+                 folders_.end());
+}
+
+std::unordered_map<std::string, std::string> Ledger::LastProviders() const {
+  std::unordered_map<std::string, std::string> providers;
+  for (const LoadedFolder &folder : folders_)
+    for (const PlacedFile &file : folder.files)
+      providers[PlaceKey(file.place, file.name)] = folder.name;
+  return providers;
+}
+
+std::optional<Journal> Journal::Read(const fs::path &keeping, Failures &failures) {
+  RemovePartial(PartialPath(keeping / kJournalFile));
+  const auto lines = ReadLinesIfExists(keeping / kJournalFile, failures);
+  if (!lines || lines->size() < 2)
+    return std::nullopt;
+  Journal journal;
+  const auto step = std::find(std::begin(kSteps), std::end(kSteps), (*lines)[0]);
+  if (step == std::end(kSteps))
+    return std::nullopt;
+  journal.step = static_cast<Step>(step - std::begin(kSteps));
+  journal.folder = (*lines)[1];
+  for (size_t i = 2; i < lines->size(); ++i)
+    if (const std::optional<PlacedFile> file = ParseFileLine((*lines)[i]))
+      journal.entries.push_back({*file, (*lines)[i][2] == '+'});
+  return journal;
+}
+
+bool Journal::Write(const fs::path &keeping, Failures &failures) const {
+  std::string text = std::string(kSteps[static_cast<size_t>(step)]) + "\r\n" + folder + "\r\n";
+  for (const Entry &entry : entries)
+    if (Storable(entry.file.name))
+      text += FileLine(entry.file, entry.keepOriginal ? '+' : '-') + "\r\n";
+  std::error_code error;
+  fs::create_directories(keeping, error);
+  return WriteAtomically(keeping / kJournalFile, text, failures);
+}
+
+void Journal::Remove(const fs::path &keeping) {
+  std::error_code error;
+  fs::remove(keeping / kJournalFile, error);
+}
+
+bool MoveReplacing(const fs::path &from, const fs::path &to, Failures &failures) {
+  std::error_code error;
+  fs::create_directories(to.parent_path(), error);
+  if (fs::exists(to, error))
+    MakeWritable(to, failures);
+  fs::rename(from, to, error);
+  if (!error)
+    return true;
+  // Another disk: a complete copy first, so that the file is never in neither place.
+  return CopyReplacing(from, to, failures) && RemoveFile(from, failures);
+}
