@@ -82,7 +82,7 @@ TEST_F(WindowsFiles, ResetAllDeletesReadOnlyFilesAndKeepsHiddenOnes) {
   Give(InGame("readme.txt"), FILE_ATTRIBUTE_READONLY);
   Give(InGame("hidden.dat"), FILE_ATTRIBUTE_HIDDEN);
   Give(InGame("system.dat"), FILE_ATTRIBUTE_SYSTEM);
-  ResetAll(state, caption, failures);
+  ResetAll(state, CleanUpNames(state, failures), caption, failures);
   EXPECT_FALSE(game.Exists("readme.txt"));
   EXPECT_FALSE(game.Exists("plain.dat"));
   EXPECT_TRUE(game.Exists("hidden.dat"));
@@ -121,17 +121,19 @@ TEST_F(WindowsFiles, AFileHeldOpenIsSkippedNamedAndLeftAsItWas) {
   }
   EXPECT_EQ(game.Read("held.dat"), "the game's");
 
-  Give(InGame("held.dat"), FILE_ATTRIBUTE_READONLY);
+  // The game's own held.dat was not replaced, so the unload leaves it alone; the copy free.dat is
+  // held open now.
+  Give(InGame("free.dat"), FILE_ATTRIBUTE_READONLY);
   game.WithRecord("kept\r\n");
   Failures later;
   {
-    HeldOpen held(InGame("held.dat"));
+    HeldOpen held(InGame("free.dat"));
     HeldOpen record(game.Library() / "FoldersLoaded.txt");
     MoveOut(state, game.Library() / "S-Held", caption, later);
   }
-  EXPECT_FALSE(game.Exists("free.dat"));
-  EXPECT_TRUE(game.Exists("held.dat"));
-  EXPECT_TRUE(Has(InGame("held.dat"), FILE_ATTRIBUTE_READONLY));
+  EXPECT_EQ(game.Read("held.dat"), "the game's");
+  EXPECT_TRUE(game.Exists("free.dat"));
+  EXPECT_TRUE(Has(InGame("free.dat"), FILE_ATTRIBUTE_READONLY));
   EXPECT_EQ(game.Record(), "kept\r\n");
   EXPECT_FALSE(game.Exists("ZEP128/FoldersLoaded.txt.partial"));
   EXPECT_EQ(later.Lines().size(), 2u) << later.Message("");

@@ -1,7 +1,9 @@
 #include "tests/game_folder.h"
 #include "tests/window_driver.h"
+#include "ui/input_blocker.h"
 
 #include <QApplication>
+#include <QKeyEvent>
 #include <QMessageBox>
 #include <QTableWidget>
 #include <QTest>
@@ -75,6 +77,16 @@ TEST(GridClickWindow, SingleSelectionSwapsAndMultiSelectionKeepsBoth) {
   EXPECT_TRUE(game.Exists("a.wav"));
   EXPECT_TRUE(game.Exists("b.wav"));
   EXPECT_EQ(game.Record(), "S-two\r\nN-a\r\nN-b\r\n\r\n");
+
+  // A held Enter repeats, and clicks arrive while a load runs: neither may act again.
+  QKeyEvent held(QEvent::KeyPress, Qt::Key_Return, Qt::NoModifier, "\r", true);
+  QApplication::sendEvent(driver.Grid(), &held);
+  {
+    const InputBlocker loading;
+    driver.ClickRow(4);
+  }
+  EXPECT_EQ(Mark(driver, 4), "S");
+  EXPECT_TRUE(game.Exists("b.wav"));
 }
 
 TEST(GridClickWindow, CampaignSwapCarriesEverySaveFileIntoTheOtherCampaign) {

@@ -45,11 +45,18 @@ TEST(MusicSets, AFailedSwitchChangesNoFolderAndSaysSo) {
   MakeThreeSets(game);
   game.Write("NotAFolder", "file");
   Failures failures;
-  EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "NotAFolder", Journal(game),
-                           failures)); // second rename fails
+  EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "NotAFolder", Journal(game), failures));
   EXPECT_FALSE(SwitchMusic(game.Path(), "", "Set1", Journal(game), failures));
   EXPECT_FALSE(SwitchMusic(game.Path(), "Set2", "Set1", Journal(game), failures)); // Set2 is taken
   EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "..", Journal(game), failures));
   EXPECT_EQ(failures.Lines().size(), 4u);
   ExpectUntouched(game);
+  // Where letter case tells folders apart, a second "MUSIC" would leave the game without music.
+  if (IsCaseSensitive(game.Path())) {
+    game.MakeFolder("MUSIC");
+    EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "Set1", Journal(game), failures));
+    EXPECT_NE(failures.Lines().back().find("MUSIC is in the way"), std::string::npos);
+    ExpectUntouched(game);
+  }
+  EXPECT_FALSE(game.Exists("ZEP128/journal"));
 }

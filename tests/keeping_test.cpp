@@ -1,0 +1,156 @@
+#include "app/selector.h"
+#include "base/names.h"
+#include "library/keeping.h"
+#include "tests/game_folder.h"
+
+#include <gtest/gtest.h>
+
+#include <memory>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+// A game whose library has three sound folders (several may be loaded) that share "sky.spt",
+// and the game's own "bases.dat" that two of them replace.
+class Keeping : public ::testing::Test {
+protected:
+  void SetUp() override {
+    game.WithGameFolders().WithCategories("Sounds: N\r\nSkins: S\r\n");
+    for (const char *folder : {"N-A", "N-B", "N-C"})
+      game.Write(std::string("ZEP128/") + folder + "/sky.spt", folder);
+    game.Write("ZEP128/N-A/bases.dat", "bases of A");
+    game.Write("ZEP128/N-B/BASES.DAT", "bases of B");
+    game.Write("ZEP128/N-A/a.msn", "mission of A");
+    game.Write("bases.dat", kOriginal);
+    game.Write("Savedata/a.msn", "the player's mission");
+    Restart();
+  }
+  // A new start of the program on the same game folder.
+  void Restart() {
+    selector = std::make_unique<Selector>(game.Path(), caption, starter);
+    selector->StartUp(failures);
+  }
+  std::string Click(const std::string &folder) {
+    return selector->ClickRow(RowOf(selector->State().Unigrid, folder), failures);
+  }
+  std::string Mark(const std::string &folder) const {
+    const FolderGrid &grid = selector->State().Unigrid;
+    return grid.Row(RowOf(grid, folder)).mark;
+  }
+
+  static inline const std::string kOriginal = std::string("the game's own\0\xff bases", 23);
+  GameFolder game;
+  RecordingCaption caption;
+  NotingStarter starter;
+  std::unique_ptr<Selector> selector;
+  Failures failures;
+};
+
+} // namespace
+
+TEST_F(Keeping, AnUnloadPutsBackTheFileOfTheFolderLoadedLast) {
+  EXPECT_EQ(Click("N-A"), "");
+  EXPECT_EQ(Click("N-B"), "\"N-B\" replaced files of \"N-A\", which stay loaded. Unloading "
+                          "\"N-B\" puts their files back.");
+  EXPECT_NE(Click("N-C").find("replaced files of \"N-B\", which"), std::string::npos);
+  EXPECT_EQ(game.Read("sky.spt"), "N-C");
+  Click("N-C");
+  EXPECT_EQ(game.Read("sky.spt"), "N-B");
+  Restart();
+  Click("N-A");
+  EXPECT_EQ(game.Read("sky.spt"), "N-B");
+  Click("N-B");
+  EXPECT_FALSE(game.Exists("sky.spt"));
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+  EXPECT_TRUE(failures.Empty()) << failures.Message("");
+}
+
+TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
+  Click("N-A");
+  EXPECT_EQ(game.Read("bases.dat"), "bases of A");
+  EXPECT_EQ(game.Read("Savedata/a.msn"), "mission of A");
+  Restart(); // the kept originals outlast the program
+  Click("N-B");
+  Click("N-A");
+  EXPECT_EQ(game.Read("bases.dat"), "bases of B");
+  EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
+  Click("N-B");
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+
+  Click("N-A");
+  Click("N-B");
+  const std::vector<std::string> names = selector->ResetAllFiles(failures);
+  EXPECT_EQ(names, (std::vector<std::string>{"bases.dat", "sky.spt"}));
+  selector->ResetAll(names, failures);
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+  EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
+  EXPECT_FALSE(game.Exists("sky.spt"));
+  EXPECT_EQ(Mark("N-A") + Mark("N-B"), "");
+  EXPECT_TRUE(failures.Empty()) << failures.Message("");
+}
+
+TEST_F(Keeping, TheNextStartRollsAnInterruptedLoadBack) {
+  // Killed after keeping the original and half way through the copies.
+  game.Write("ZEP128/#Selector/journal.txt",
+             "load\r\nN-A\r\n\tG+bases.dat\r\n\tG-sky.spt\r\n\tS+a.msn\r\n");
+  game.MakeFolder("ZEP128/#Selector/originals/G");
+  fs::rename(game.Path() / "bases.dat", game.Path() / "ZEP128/#Selector/originals/G/bases.dat");
+  game.Write("sky.spt", "N-A");
+  game.Write("bases.dat.partial", "bases o");
+  game.Write("ZEP128/FoldersLoaded.txt.partial", "N-A\r\n");
+  game.WithRecord("N-A\r\n\r\n");
+  Restart();
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+  EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
+  for (const char *gone :
+       {"sky.spt", "bases.dat.partial", "ZEP128/FoldersLoaded.txt.partial",
+        "ZEP128/#Selector/journal.txt", "ZEP128/#Selector/originals/G/bases.dat"})
+    EXPECT_FALSE(game.Exists(gone)) << gone;
+  EXPECT_EQ(Mark("N-A"), "");
+  EXPECT_EQ(game.Record(), "\r\n");
+  EXPECT_TRUE(failures.Empty()) << failures.Message("");
+}
+
+TEST_F(Keeping, TheNextStartFinishesAnInterruptedUnloadResetAndMusicSwitch) {
+  Click("N-A");
+  // Killed during the unload of N-A, before anything was taken out.
+  game.Write("ZEP128/#Selector/journal.txt", "unload\r\nN-A\r\n\tG-bases.dat\r\n\tG-sky.spt\r\n");
+  Restart();
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+  EXPECT_FALSE(game.Exists("sky.spt"));
+  EXPECT_EQ(Mark("N-A"), "");
+  EXPECT_EQ(game.Record(), "\r\n");
+
+  Click("N-A");
+  // Killed after Reset All deleted its files, before the originals were back.
+  fs::remove(game.Path() / "bases.dat");
+  game.Write("ZEP128/#Selector/journal.txt", "restore\r\n\r\n");
+  game.Write("Music/a.bgm", "active");
+  game.Write("Set1/b.bgm", "chosen");
+  game.Write("ZEP128/#Selector/music.txt", "Music\r\nSet0\r\nSet1\r\n");
+  fs::rename(game.Path() / "Music", game.Path() / "Set0");
+  Restart();
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+  EXPECT_EQ(Mark("N-A"), "");
+  EXPECT_EQ(game.Read("Music/b.bgm"), "chosen");
+  EXPECT_EQ(game.Read("Set0/a.bgm"), "active");
+  EXPECT_FALSE(game.Exists("ZEP128/#Selector/music.txt"));
+  EXPECT_TRUE(failures.Empty()) << failures.Message("");
+}
+
+TEST_F(Keeping, AFolderGoneFromTheLibraryOrPartlyLoadedIsSaidSo) {
+  fs::remove_all(game.Path() / "ZEP128/N-C");
+  Click("N-C");
+  EXPECT_EQ(Mark("N-C"), "");
+  ASSERT_EQ(failures.Lines().size(), 1u);
+  EXPECT_NE(failures.Lines()[0].find("is no longer in the library"), std::string::npos);
+
+  Failures partly;
+  game.MakeFolder("sky.spt.partial/in the way");
+  game.MakeFolder("sky.spt/in the way");
+  selector->ClickRow(RowOf(selector->State().Unigrid, "N-B"), partly);
+  EXPECT_EQ(Mark("N-B"), "S");
+  EXPECT_EQ(partly.Lines().size(), 1u);
+  EXPECT_EQ(partly.HeadingOr("").find("\"N-B\" is only partly loaded"), 0u);
+}
