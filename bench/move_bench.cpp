@@ -145,7 +145,9 @@ void BenchMoveOut(benchmark::State &bench, const Workload *work) {
   Failures failures;
   for (auto _ : bench) {
     bench.PauseTiming();
-    Loaded(*work);
+    // Loaded by the program, so that the unload knows from its ledger what the load put where.
+    Unloaded(*work);
+    MoveIn(state, work->addon, caption, failures);
     bench.ResumeTiming();
     MoveOut(state, work->addon, caption, failures);
   }

@@ -1,0 +1,156 @@
+// crash_driver <game folder> <step> [name]: one step of the kill test in scripts/kill_test.sh.
+//   start            start-up only: what a crash interrupted is finished or rolled back
+//   click NAME       start-up, then a click on the folder row NAME (load or unload)
+//   reset            start-up, then Reset All of every file it lists
+//   music            start-up, then a switch to the first music set listed
+//   manifest FILE    notes the player's files (game folder and Savedata) and their checksums
+//   check FILE       prints each damage found and exits 1 when there is any
+#include "app/selector.h"
+#include "base/listing.h"
+#include "base/names.h"
+#include "base/text_file.h"
+#include "library/game_places.h"
+#include "library/keeping.h"
+#include "library/loaded_record.h"
+
+#include <cstdint>
+#include <fstream>
+#include <iostream>
+#include <map>
+#include <set>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+class SilentCaption : public Caption {
+public:
+  std::string Get() const override { return text_; }
+  void Set(const std::string &text) override { text_ = text; }
+
+private:
+  std::string text_;
+};
+
+class NoStarter : public ProgramStarter {
+public:
+  bool StartDetached(const fs::path &, bool) override { return false; }
+};
+
+// FNV-1a of the file's bytes; "missing" when it cannot be read.
+std::string Checksum(const fs::path &file) {
+  Failures ignored;
+  const std::optional<std::string> bytes = ReadBytes(file, ignored);
+  if (!bytes || !fs::is_regular_file(file))
+    return "missing";
+  std::uint64_t hash = 1469598103934665603ULL;
+  for (char c : *bytes)
+    hash = (hash ^ static_cast<unsigned char>(c)) * 1099511628211ULL;
+  return std::to_string(hash);
+}
+
+// The player's files: relative path and checksum, of the game folder and "Savedata".
+std::map<std::string, std::string> PlayerFiles(const fs::path &game) {
+  std::map<std::string, std::string> files;
+  for (const std::string &name : ListFiles(game))
+    files[name] = Checksum(game / name);
+  for (const std::string &name : ListFiles(game / "Savedata"))
+    files["Savedata/" + name] = Checksum(game / "Savedata" / name);
+  return files;
+}
+
+int WriteManifest(const fs::path &game, const fs::path &manifest) {
+  std::ofstream out(manifest);
+  for (const auto &[name, sum] : PlayerFiles(game))
+    out << sum << ' ' << name << '\n';
+  return 0;
+}
+
+// Where a player's file may rightly be: in its place, kept as an original, or, for a saved
+// game, carried home into a campaign folder.
+bool Found(const fs::path &game, const std::string &relative, const std::string &sum) {
+  const bool saved = StartsWith(relative, "Savedata/");
+  const std::string name = saved ? relative.substr(9) : relative;
+  const fs::path keeping = KeepingFolder(game / "ZEP128");
+  if (Checksum(game / relative) == sum ||
+      Checksum(OriginalPath(keeping, {saved ? Place::Savedata : Place::Game, name})) == sum)
+    return true;
+  for (const fs::path &folder : ListFolders(game / "ZEP128"))
+    if (IsSaveFile(name) && Checksum(folder / name) == sum)
+      return true;
+  return false;
+}
+
+int Check(const fs::path &game, const fs::path &manifest) {
+  std::set<std::string> damage;
+  for (const auto &entry : fs::recursive_directory_iterator(game))
+    if (EndsWith(NameText(entry.path()), ".partial"))
+      damage.insert("temporary file left: " + DisplayPath(entry.path()));
+  std::ifstream in(manifest);
+  for (std::string sum, name; in >> sum && std::getline(in >> std::ws, name);)
+    if (!Found(game, name, sum))
+      damage.insert("player's file lost or changed: " + name);
+  const LibraryState state = LibraryFor(game);
+  Failures ignored;
+  const fs::path keeping = KeepingFolder(state.LibDir);
+  if (fs::exists(keeping / "journal.txt") || fs::exists(keeping / "music.txt"))
+    damage.insert("a journal is still open");
+  const Ledger ledger = Ledger::Read(keeping, ignored);
+  std::set<std::string> recorded, ledgered;
+  for (const std::string &name : ReadLoadedNames(state, ignored))
+    recorded.insert(name);
+  for (const LoadedFolder &folder : ledger.Folders())
+    ledgered.insert(folder.name);
+  if (recorded != ledgered)
+    damage.insert("the record and the ledger disagree on what is loaded");
+  GamePlaces places(game);
+  for (const auto &[key, provider] : ledger.LastProviders()) {
+    const LoadedFolder *folder = ledger.Find(provider);
+    for (const PlacedFile &file : folder->files)
+      if (PlaceKey(file.place, file.name) == key &&
+          Checksum(Child(places.Folder(file.place), file.name)) !=
+              Checksum(FindAnyCase(Child(state.LibDir, provider), file.name)))
+        damage.insert("game file is not the loaded folder's copy: " + file.name);
+  }
+  if (!fs::is_directory(FindAnyCase(game, "Music")))
+    damage.insert("the game has no Music folder");
+  for (const std::string &line : damage)
+    std::cout << line << '\n';
+  return damage.empty() ? 0 : 1;
+}
+
+} // namespace
+
+int main(int argc, char **argv) {
+  if (argc < 3)
+    return 2;
+  const fs::path game = argv[1];
+  const std::string step = argv[2];
+  const std::string name = argc > 3 ? argv[3] : "";
+  if (step == "manifest")
+    return WriteManifest(game, name);
+  if (step == "check")
+    return Check(game, name);
+  SilentCaption caption;
+  NoStarter starter;
+  Selector selector(game, caption, starter);
+  Failures failures;
+  selector.StartUp(failures);
+  if (step == "click") {
+    const FolderGrid &grid = selector.State().Unigrid;
+    for (int row = 1; row < grid.RowCount(); ++row)
+      if (grid.Row(row).name == name) {
+        selector.ClickRow(row, failures);
+        break;
+      }
+  } else if (step == "reset") {
+    selector.ResetAll(selector.ResetAllFiles(failures), failures);
+  } else if (step == "music") {
+    const MusicList music = selector.MusicSets(failures);
+    if (music.current && !music.entries.empty())
+      selector.SwitchMusic(*music.current, music.entries.front(), failures);
+  }
+  for (const std::string &line : failures.Lines())
+    std::cerr << line << '\n';
+  return 0;
+}
