@@ -120,10 +120,14 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
 
 bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures) {
   const fs::path temporary = PartialPath(target);
-  // What an interrupted copy left may be read-only: it must not block this one.
-  RemovePartial(temporary);
   std::error_code error;
   fs::copy_file(source, temporary, fs::copy_options::overwrite_existing, error);
+  if (error) {
+    // What an interrupted copy left may be read-only: it must not block this one.
+    RemovePartial(temporary);
+    error.clear();
+    fs::copy_file(source, temporary, fs::copy_options::overwrite_existing, error);
+  }
   if (error) {
     failures.Add(source,
                  "cannot be copied to " + DisplayPath(target) + " (" + error.message() + ")");

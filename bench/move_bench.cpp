@@ -148,6 +148,7 @@ void BenchMoveOut(benchmark::State &bench, const Workload *work) {
     // Loaded by the program, so that the unload knows from its ledger what the load put where.
     Unloaded(*work);
     MoveIn(state, work->addon, caption, failures);
+    ::sync();
     bench.ResumeTiming();
     MoveOut(state, work->addon, caption, failures);
   }

@@ -51,7 +51,7 @@ void MoveOut(LibraryState &state, const fs::path &folder, Caption &caption, Fail
                              DisplayPath(keeping));
     return;
   }
-  UnplaceFiles(state, ledger, journal.entries, caption, failures);
+  UnplaceFiles(state, ledger, journal.entries, false, caption, failures);
   ledger.Write(keeping, failures);
   SaveLoaded(state, failures);
   Journal::Remove(keeping);

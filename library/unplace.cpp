@@ -1,40 +1,49 @@
 #include "library/unplace.h"
 
-#include "base/existence.h"
 #include "base/file_ops.h"
+#include "base/listing.h"
 #include "base/names.h"
 #include "library/game_places.h"
 
+#include <unordered_set>
+
 namespace fs = std::filesystem;
 
+// The kept originals by PlaceKey, listed once.
+static std::unordered_set<std::string> KeptOriginals(const fs::path &keeping) {
+  std::unordered_set<std::string> kept;
+  for (const Place place : {Place::Game, Place::Savedata, Place::Music})
+    for (const std::string &name : ListFiles(OriginalsFolder(keeping, place)))
+      kept.insert(PlaceKey(place, name));
+  return kept;
+}
+
 void UnplaceFiles(const LibraryState &state, const Ledger &ledger,
-                  const std::vector<Journal::Entry> &entries, Caption &caption,
+                  const std::vector<Journal::Entry> &entries, bool afterCrash, Caption &caption,
                   Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
   const auto providers = ledger.LastProviders();
+  const std::unordered_set<std::string> kept = KeptOriginals(keeping);
   GamePlaces places(state.EAWDir);
   for (const Journal::Entry &entry : entries) {
     const PlacedFile &file = entry.file;
     if (IsSaveFile(file.name))
       continue;
     const fs::path target = Child(places.Folder(file.place), file.name);
-    RemovePartial(PartialPath(target));
-    const fs::path original = OriginalPath(keeping, file);
-    FileCheck(original);
-    const bool originalKept = FileFound;
+    if (afterCrash)
+      RemovePartial(PartialPath(target));
+    const std::string key = PlaceKey(file.place, file.name);
+    const bool originalKept = kept.count(key) > 0;
     if (entry.keepOriginal && !originalKept)
       continue;
-    const auto provider = providers.find(PlaceKey(file.place, file.name));
+    const auto provider = providers.find(key);
     if (provider != providers.end()) {
       caption.Set("Please wait- copying: :" + file.name);
       CopyReplacing(FindAnyCase(Child(state.LibDir, provider->second), file.name), target,
                     failures);
     } else if (originalKept) {
-      MoveReplacing(original, target, failures);
+      MoveReplacing(OriginalPath(keeping, file), target, failures);
     } else {
-      FileCheck(target);
-      if (!FileFound)
-        continue;
       caption.Set("Deleting " + file.name);
       RemoveFile(target, failures);
     }

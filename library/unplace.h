@@ -10,6 +10,8 @@
 // Takes files that a folder put into the game out again: each is replaced by the copy of the
 // folder still loaded in `ledger` that was loaded last and provides that name, else by the
 // game's kept original, else deleted. Save files stay. An entry whose original is to be kept but
-// is not in the keeping folder yet is still the original and stays too.
+// is not in the keeping folder yet is still the original and stays too. After a crash,
+// `afterCrash` also removes the temporary copies the interrupted work may have left.
 void UnplaceFiles(const LibraryState &state, const Ledger &ledger,
-                  const std::vector<Journal::Entry> &entries, Caption &caption, Failures &failures);
+                  const std::vector<Journal::Entry> &entries, bool afterCrash, Caption &caption,
+                  Failures &failures);
