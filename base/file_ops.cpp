@@ -1,10 +1,11 @@
 #include "base/file_ops.h"
 
 #include "base/names.h"
+#include "base/new_file.h"
 #include "base/text_file.h"
 
-#include <cerrno>
-#include <fstream>
+#include <cstdio>
+#include <functional>
 #include <optional>
 #include <system_error>
 
@@ -48,29 +49,32 @@ bool MakeWritable(const fs::path &path, Failures &failures) {
 }
 
 fs::path PartialPath(const fs::path &target) {
-  fs::path partial = target;
-  partial += ".partial";
-  return partial;
+  // Names may have 255 bytes: a long one gives its temporary name a short stem and its hash, so
+  // that every name can be copied.
+  constexpr size_t kLongest = 255, kKeptBytes = 200;
+  std::string name = NameText(target);
+  if (name.size() + std::string_view(".partial").size() > kLongest) {
+    size_t cut = kKeptBytes;
+    while (cut > 0 && (static_cast<unsigned char>(name[cut]) & 0xC0) == 0x80)
+      --cut;
+    char hash[20];
+    std::snprintf(hash, sizeof hash, "~%08zx", std::hash<std::string>{}(name)&0xFFFFFFFFu);
+    name = name.substr(0, cut) + hash;
+  }
+  return Child(target.parent_path(), name + ".partial");
 }
 
 void RemovePartial(const fs::path &partial) {
   std::error_code error;
-  if (!fs::is_regular_file(partial, error))
+  // A link of that name is removed itself, never what it points to.
+  const fs::file_status status = fs::symlink_status(partial, error);
+  if (!fs::is_regular_file(status) && !fs::is_symlink(status))
     return;
 #ifdef _WIN32
   // A copy of a read-only file left by a crash is read-only too, and Windows keeps it otherwise.
   SetFileAttributesW(partial.c_str(), FILE_ATTRIBUTE_NORMAL);
 #endif
   fs::remove(partial, error);
-}
-
-static bool WriteWhole(const fs::path &path, const std::string &bytes) {
-  std::ofstream out(path, std::ios::binary | std::ios::trunc);
-  if (!out)
-    return false;
-  out.write(bytes.data(), static_cast<std::streamsize>(bytes.size()));
-  out.close();
-  return !out.fail();
 }
 
 static std::optional<fs::perms> PermissionsOf(const fs::path &path) {
@@ -82,11 +86,17 @@ static std::optional<fs::perms> PermissionsOf(const fs::path &path) {
 }
 
 bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures &failures) {
+  std::error_code error;
+  if (fs::is_symlink(target, error)) {
+    failures.Add(target, "is a link; the program does not write through links, so that nothing "
+                         "outside the game folder changes");
+    return false;
+  }
   const fs::path temporary = PartialPath(target);
   RemovePartial(temporary);
-  errno = 0;
-  if (!WriteWhole(temporary, bytes)) {
-    failures.Add(target, "cannot be written (" + LastErrorText() + ")");
+  error = WriteNewFile(temporary, bytes);
+  if (error) {
+    failures.Add(target, "cannot be written (" + ReasonOf(error) + ")");
     RemovePartial(temporary);
     return false;
   }
@@ -99,7 +109,6 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
     RemovePartial(temporary);
     return false;
   }
-  std::error_code error;
   fs::rename(temporary, target, error);
   if (error) {
     failures.Add(target, "cannot be replaced (" + error.message() + ")");
@@ -120,17 +129,15 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
 
 bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures) {
   const fs::path temporary = PartialPath(target);
-  std::error_code error;
-  fs::copy_file(source, temporary, fs::copy_options::overwrite_existing, error);
-  if (error) {
-    // What an interrupted copy left may be read-only: it must not block this one.
+  std::error_code error = CopyToNewFile(source, temporary);
+  if (error == std::errc::file_exists) {
+    // What an interrupted copy left must not block this one.
     RemovePartial(temporary);
-    error.clear();
-    fs::copy_file(source, temporary, fs::copy_options::overwrite_existing, error);
+    error = CopyToNewFile(source, temporary);
   }
   if (error) {
     failures.Add(source,
-                 "cannot be copied to " + DisplayPath(target) + " (" + error.message() + ")");
+                 "cannot be copied to " + DisplayPath(target) + " (" + ReasonOf(error) + ")");
     RemovePartial(temporary);
     return false;
   }

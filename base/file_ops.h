@@ -12,7 +12,8 @@ bool MakeNormal(const std::filesystem::path &path, Failures &failures);
 bool MakeWritable(const std::filesystem::path &path, Failures &failures);
 // Replaces `target` by `bytes` through a temporary file beside it and a rename, so that the file
 // is always either the old or the new one; a replaced file keeps its permissions (on Windows its
-// hidden and system attributes) and ends writable. Returns false, with the reason, on failure; the old file is then left as it was.
+// hidden and system attributes) and ends writable. Returns false, with the reason, on failure; the
+// old file is then left as it was.
 bool WriteAtomically(const std::filesystem::path &target, const std::string &bytes,
                      Failures &failures);
 // Copies `source` over `target` through the temporary file "<target>.partial" and a rename, so

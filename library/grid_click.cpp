@@ -54,9 +54,10 @@ std::vector<std::string> Load(LibraryState &state, int row, Caption &caption, Fa
   Journal::Remove(KeepingFolder(state.LibDir));
   if (failures.Lines().size() > before)
     failures.SetHeading("\"" + state.Unigrid.Row(row).name +
-                        "\" is only partly loaded: the files below are missing from the game. "
-                        "Free some disk space, or close the game if it is running, then unload "
-                        "the folder and load it again.");
+                        "\" is only partly loaded: the files below are missing from the game, "
+                        "each with the reason. Mend what the reasons say (free some disk space, "
+                        "close the game if it is running), then unload the folder and load it "
+                        "again.");
   return overwritten;
 }
 

@@ -1,0 +1,146 @@
+#include "base/new_file.h"
+
+#ifdef _WIN32
+#include <algorithm>
+
+#include <windows.h>
+#else
+#include <cerrno>
+#include <fcntl.h>
+#include <sys/sendfile.h>
+#include <sys/stat.h>
+#include <unistd.h>
+#endif
+
+namespace fs = std::filesystem;
+
+#ifdef _WIN32
+static std::error_code LastError() {
+  return std::error_code(static_cast<int>(GetLastError()), std::system_category());
+}
+
+std::error_code WriteNewFile(const fs::path &path, const std::string &bytes) {
+  // CREATE_NEW refuses any existing entry; a reparse point is opened, never followed.
+  HANDLE file = CreateFileW(path.c_str(), GENERIC_WRITE, 0, nullptr, CREATE_NEW,
+                            FILE_ATTRIBUTE_NORMAL | FILE_FLAG_OPEN_REPARSE_POINT, nullptr);
+  if (file == INVALID_HANDLE_VALUE)
+    return LastError();
+  std::error_code error;
+  for (size_t done = 0; done < bytes.size() && !error;) {
+    const DWORD chunk = static_cast<DWORD>(std::min<size_t>(bytes.size() - done, 1 << 20));
+    DWORD written = 0;
+    if (WriteFile(file, bytes.data() + done, chunk, &written, nullptr))
+      done += written;
+    else
+      error = LastError();
+  }
+  CloseHandle(file);
+  return error;
+}
+
+std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
+  std::error_code error;
+  if (fs::is_symlink(source, error))
+    return std::make_error_code(std::errc::too_many_symbolic_link_levels);
+  if (!CopyFileW(source.c_str(), path.c_str(), TRUE))
+    return LastError();
+  return {};
+}
+#else
+static std::error_code LastError() { return std::error_code(errno, std::generic_category()); }
+
+// Writes all of `size` bytes, going on after a short write.
+static bool WriteAll(int file, const char *data, size_t size) {
+  while (size > 0) {
+    const ssize_t written = ::write(file, data, size);
+    if (written < 0 && errno == EINTR)
+      continue;
+    if (written <= 0)
+      return false;
+    data += written;
+    size -= static_cast<size_t>(written);
+  }
+  return true;
+}
+
+// O_EXCL refuses any existing entry, also a link, dangling or not.
+static int CreateNew(const fs::path &path) {
+  return ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
+}
+
+std::error_code WriteNewFile(const fs::path &path, const std::string &bytes) {
+  const int file = CreateNew(path);
+  if (file < 0)
+    return LastError();
+  std::error_code error;
+  if (!WriteAll(file, bytes.data(), bytes.size()))
+    error = LastError();
+  if (::close(file) != 0 && !error)
+    error = LastError();
+  return error;
+}
+
+// Copies what is left of `in` into `out`; the kernel moves the bytes where it can.
+static bool CopyContent(int in, int out, off_t size) {
+  while (size > 0) {
+    const ssize_t sent = ::sendfile(out, in, nullptr, static_cast<size_t>(size));
+    if (sent < 0 && errno == EINTR)
+      continue;
+    if (sent < 0 && (errno == EINVAL || errno == ENOSYS))
+      break;
+    if (sent <= 0)
+      return sent == 0;
+    size -= sent;
+  }
+  char buffer[1 << 16];
+  for (;;) {
+    const ssize_t got = ::read(in, buffer, sizeof buffer);
+    if (got < 0 && errno == EINTR)
+      continue;
+    if (got <= 0)
+      return got == 0;
+    if (!WriteAll(out, buffer, static_cast<size_t>(got)))
+      return false;
+  }
+}
+
+std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
+  const int in = ::open(source.c_str(), O_RDONLY | O_NOFOLLOW | O_CLOEXEC);
+  if (in < 0)
+    return errno == ELOOP ? std::make_error_code(std::errc::too_many_symbolic_link_levels)
+                          : LastError();
+  struct stat info {};
+  if (::fstat(in, &info) != 0 || !S_ISREG(info.st_mode)) {
+    const std::error_code error =
+        S_ISREG(info.st_mode) ? LastError() : std::make_error_code(std::errc::invalid_argument);
+    ::close(in);
+    return error;
+  }
+  const int out = CreateNew(path);
+  if (out < 0) {
+    const std::error_code error = LastError();
+    ::close(in);
+    return error;
+  }
+  std::error_code error;
+  if (!CopyContent(in, out, info.st_size))
+    error = LastError();
+  if (::close(out) != 0 && !error)
+    error = LastError();
+  ::close(in);
+  return error;
+}
+#endif
+
+std::string ReasonOf(const std::error_code &error) {
+  if (error == std::errc::no_space_on_device)
+    return "the disk is full";
+#ifdef _WIN32
+  if (error.category() == std::system_category() &&
+      (error.value() == ERROR_DISK_FULL || error.value() == ERROR_HANDLE_DISK_FULL))
+    return "the disk is full";
+#endif
+  if (error == std::errc::too_many_symbolic_link_levels)
+    return "it is a link, and the program does not follow links";
+  return error.message();
+}

@@ -1,0 +1,16 @@
+#pragma once
+
+#include <filesystem>
+#include <string>
+#include <system_error>
+
+// Writes `bytes` into the new file `path`. The file is created only when no entry of that name
+// exists, so that a file or link planted there is never written through. Returns the error when
+// that fails.
+std::error_code WriteNewFile(const std::filesystem::path &path, const std::string &bytes);
+// Copies the file `source` into the new file `path`, created the same way; a source that is a link
+// is refused. Returns the error when that fails.
+std::error_code CopyToNewFile(const std::filesystem::path &source,
+                              const std::filesystem::path &path);
+// The reason of `error` for a message: "the disk is full" when it is, else the system's words.
+std::string ReasonOf(const std::error_code &error);

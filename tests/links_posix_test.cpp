@@ -1,0 +1,76 @@
+#include "app/selector.h"
+#include "tests/game_folder.h"
+
+#include <gtest/gtest.h>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+// A game with one loadable folder, and a file outside the game folder that links point at.
+class Links : public ::testing::Test {
+protected:
+  void SetUp() override {
+    game.WithGameFolders().WithCategories("Skins: S\r\n").WithRecord("");
+    game.Addon("S-One", {"planes.dat"});
+    game.Write("eaw.ini", "Width=800\r\n");
+    game.Write("Music.ini", "Set1\r\nSet2\r\n");
+    game.Write("Set1/a.bgm");
+    outside.Write("target.txt", "outside");
+    selector.StartUp(failures);
+  }
+  // A link at `relative` in the game folder to the outside file; false when it cannot be made.
+  bool Plant(const std::string &relative) {
+    std::error_code error;
+    fs::create_symlink(outside.Path() / "target.txt", game.Path() / relative, error);
+    return !error;
+  }
+  void ExpectOutsideUntouched() const {
+    EXPECT_EQ(outside.Read("target.txt"), "outside");
+    EXPECT_TRUE(IsWritable(outside.Path() / "target.txt") == outsideWritable);
+  }
+
+  GameFolder game;
+  TestFolder outside;
+  bool outsideWritable = true;
+  RecordingCaption caption;
+  NotingStarter starter;
+  Selector selector{game.Path(), caption, starter};
+  Failures failures;
+};
+
+} // namespace
+
+TEST_F(Links, TemporaryNamesPlantedAsLinksAreNeverWrittenThrough) {
+  for (const char *name :
+       {"planes.dat.partial", "ZEP128/FoldersLoaded.txt.partial", "eaw.ini.partial",
+        "ZEP128/#Selector/loaded.txt.partial", "ZEP128/#Selector/journal.txt.partial"}) {
+    game.MakeFolder("ZEP128/#Selector");
+    ASSERT_TRUE(Plant(name)) << name;
+  }
+  selector.ClickRow(1, failures);
+  selector.SaveSettings({"1024"}, failures);
+  EXPECT_TRUE(selector.SwitchMusic("Set2", "Set1", failures));
+  EXPECT_EQ(game.Read("planes.dat"), "planes.dat");
+  EXPECT_EQ(game.Record(), "S-One\r\n\r\n");
+  EXPECT_EQ(game.Read("eaw.ini"), "Width=1024\r\n");
+  ExpectOutsideUntouched();
+  EXPECT_TRUE(failures.Empty()) << failures.Message("");
+}
+
+TEST_F(Links, LinkedFilesAreRefusedAndWhatTheyPointAtStaysAsItWas) {
+  SetReadOnly(outside.Path() / "target.txt", true);
+  outsideWritable = false;
+  ASSERT_TRUE(Plant("ZEP128/S-One/linked.dat"));
+  fs::remove(game.Path() / "eaw.ini");
+  ASSERT_TRUE(Plant("eaw.ini"));
+  selector.ClickRow(1, failures);
+  selector.SaveSettings({"1024"}, failures);
+  EXPECT_FALSE(selector.SaveSettingsFile("Width=1", failures));
+  EXPECT_FALSE(game.Exists("linked.dat"));
+  EXPECT_TRUE(fs::is_symlink(game.Path() / "eaw.ini"));
+  ExpectOutsideUntouched();
+  ASSERT_EQ(failures.Lines().size(), 3u) << failures.Message("");
+  EXPECT_NE(failures.Lines()[0].find("linked.dat"), std::string::npos);
+  EXPECT_NE(failures.Lines()[0].find("link"), std::string::npos);
+}
