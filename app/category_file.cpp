@@ -73,12 +73,13 @@ Categories ReadCategories(const fs::path &libDir, Failures &failures) {
   return lines ? ParseCategories(*lines) : Categories{};
 }
 
-std::string SkippedLinesMessage(const std::vector<SkippedLine> &skipped) {
-  std::string text = "These lines of the category file \"zep.ini\" were skipped (a line needs a "
-                     "colon, and at most 256 lines are read):";
+std::vector<std::string> SkippedLinesMessage(const std::vector<SkippedLine> &skipped) {
+  std::vector<std::string> lines = {"These lines of the category file \"zep.ini\" were skipped (a "
+                                    "line needs a colon, and at most 256 lines are read):"};
+  lines.reserve(skipped.size() + 1);
   for (const SkippedLine &line : skipped)
-    text += "\nline " + std::to_string(line.number) + ": " + line.text;
-  return text;
+    lines.push_back("line " + std::to_string(line.number) + ": " + line.text);
+  return lines;
 }
 
 Categories LibraryCategories(const fs::path &libDir, Failures &failures) {

@@ -37,5 +37,6 @@ Categories ReadCategories(const std::filesystem::path &libDir, Failures &failure
 // The categories of the library: those of its category file, or the default ones when the file
 // is missing (it could not be written).
 Categories LibraryCategories(const std::filesystem::path &libDir, Failures &failures);
-// The message that names the skipped lines.
-std::string SkippedLinesMessage(const std::vector<SkippedLine> &skipped);
+// The message that names the skipped lines: a line that says what they are, then one per line,
+// so that a long list is shown as any long list of failures.
+std::vector<std::string> SkippedLinesMessage(const std::vector<SkippedLine> &skipped);

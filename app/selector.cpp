@@ -36,7 +36,8 @@ void Selector::StartUp(Failures &failures) {
   ShowCategory(0);
   state_.Ready = true;
   if (!skipped.empty())
-    failures.Add(SkippedLinesMessage(skipped));
+    for (const std::string &line : SkippedLinesMessage(skipped))
+      failures.Add(line);
 }
 
 std::string Selector::ShowCategory(int entry) {

@@ -2,14 +2,12 @@
 
 #include "base/names.h"
 
-#include <algorithm>
-
 void Failures::Add(const std::filesystem::path &path, const std::string &reason) {
   Add(DisplayPath(path) + ": " + reason);
 }
 
 void Failures::Add(const std::string &text) {
-  if (std::find(lines_.begin(), lines_.end(), text) == lines_.end())
+  if (seen_.insert(text).second)
     lines_.push_back(text);
 }
 

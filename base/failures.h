@@ -2,6 +2,7 @@
 
 #include <filesystem>
 #include <string>
+#include <unordered_set>
 #include <vector>
 
 // File operations that could not be done, gathered so that the user is told once per event.
@@ -25,5 +26,6 @@ public:
 
 private:
   std::vector<std::string> lines_;
+  std::unordered_set<std::string> seen_; // each failure is told once, found in constant time
   std::string heading_;
 };

@@ -31,7 +31,16 @@ std::vector<std::string> SplitLines(const std::string &bytes) {
 
 std::string LastErrorText() { return errno ? std::strerror(errno) : "unknown error"; }
 
-std::optional<std::string> ReadBytes(const fs::path &path, Failures &failures) {
+std::optional<std::string> ReadBytes(const fs::path &path, Failures &failures,
+                                     std::uintmax_t maxBytes) {
+  std::error_code error;
+  const std::uintmax_t size = fs::file_size(path, error);
+  if (!error && size > maxBytes) {
+    failures.Add(path, "was not read: it is " + std::to_string(size / 1024) +
+                           " KB, larger than the " + std::to_string(maxBytes / 1024) +
+                           " KB such a file can sensibly be");
+    return std::nullopt;
+  }
   errno = 0;
   std::ifstream in(path, std::ios::binary);
   if (!in) {
@@ -47,19 +56,20 @@ std::optional<std::string> ReadBytes(const fs::path &path, Failures &failures) {
 }
 
 std::optional<std::vector<std::string>> ReadLines(const fs::path &path, Failures &failures,
-                                                  Encoding encoding) {
-  std::optional<std::string> bytes = ReadBytes(path, failures);
+                                                  Encoding encoding, std::uintmax_t maxBytes) {
+  std::optional<std::string> bytes = ReadBytes(path, failures, maxBytes);
   if (!bytes)
     return std::nullopt;
   return SplitLines(encoding == Encoding::Text ? TextAsUtf8(*bytes) : *bytes);
 }
 
 std::optional<std::vector<std::string>> ReadLinesIfExists(const fs::path &path, Failures &failures,
-                                                          Encoding encoding) {
+                                                          Encoding encoding,
+                                                          std::uintmax_t maxBytes) {
   FileCheck(path);
   if (!FileFound)
     return std::nullopt;
-  return ReadLines(path, failures, encoding);
+  return ReadLines(path, failures, encoding, maxBytes);
 }
 
 std::string JoinCrLf(const std::vector<std::string> &lines) {

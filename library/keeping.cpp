@@ -12,6 +12,8 @@ namespace fs = std::filesystem;
 namespace {
 
 constexpr char kLedgerFile[] = "loaded.txt";
+// The ledger and the journal list every file of the loaded folders: allow for a great many.
+constexpr std::uintmax_t kMaxKeepingBytes = std::uintmax_t{256} << 20;
 constexpr char kJournalFile[] = "journal.txt";
 constexpr std::string_view kPlaceLetters = "GSM";
 constexpr std::string_view kSteps[] = {"load", "loaded", "unload", "reset", "restore"};
@@ -63,7 +65,8 @@ fs::path OriginalPath(const fs::path &keeping, const PlacedFile &file) {
 Ledger Ledger::Read(const fs::path &keeping, Failures &failures) {
   Ledger ledger;
   RemovePartial(PartialPath(keeping / kLedgerFile));
-  const auto lines = ReadLinesIfExists(keeping / kLedgerFile, failures);
+  const auto lines =
+      ReadLinesIfExists(keeping / kLedgerFile, failures, Encoding::Bytes, kMaxKeepingBytes);
   if (!lines)
     return ledger;
   for (const std::string &line : *lines) {
@@ -115,7 +118,8 @@ std::unordered_map<std::string, std::string> Ledger::LastProviders() const {
 
 std::optional<Journal> Journal::Read(const fs::path &keeping, Failures &failures) {
   RemovePartial(PartialPath(keeping / kJournalFile));
-  const auto lines = ReadLinesIfExists(keeping / kJournalFile, failures);
+  const auto lines =
+      ReadLinesIfExists(keeping / kJournalFile, failures, Encoding::Bytes, kMaxKeepingBytes);
   if (!lines || lines->size() < 2)
     return std::nullopt;
   Journal journal;

@@ -9,10 +9,18 @@
 
 namespace fs = std::filesystem;
 
+bool IsReservedFolderName(std::string_view name) {
+  const std::string folded = FoldName(StoredName(name));
+  for (const char *reserved : {"ZEP128", "Savedata", "Music"})
+    if (folded == FoldName(reserved))
+      return true;
+  return false;
+}
+
 bool IsMusicSetName(std::string_view line) {
   if (line == "." || line == ".." || line.find_first_of("\\/:") != std::string_view::npos)
     return false;
-  return line.find_first_not_of(" \t") != std::string_view::npos;
+  return line.find_first_not_of(" \t") != std::string_view::npos && !IsReservedFolderName(line);
 }
 
 static std::set<std::string> FoldedFolderNames(const fs::path &folder) {

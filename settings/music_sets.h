@@ -14,8 +14,11 @@ struct MusicList {
   std::optional<std::string> current; // the active set; nothing keeps what the window shows
 };
 
+// Whether `name` is a folder the program or the game relies on ("ZEP128", "Savedata", "Music",
+// in any letter case): a switch would rename it away.
+bool IsReservedFolderName(std::string_view name);
 // Whether a Music.ini line can name a set: a plain folder name of the game folder, not blank,
-// not "." or "..", without "\", "/" or ":".
+// not "." or "..", without "\", "/" or ":", and not a reserved folder.
 bool IsMusicSetName(std::string_view line);
 // The music sets of Music.ini (found whatever its letter case): a name whose folder exists is an
 // entry; the last name without a folder is the current set. A missing file gives nothing.

@@ -35,6 +35,12 @@ static bool Rename(const fs::path &from, const fs::path &to, Failures &failures)
 
 bool SwitchMusic(const fs::path &eawDir, const std::string &activeName,
                  const std::string &chosenName, const fs::path &journal, Failures &failures) {
+  if (IsReservedFolderName(chosenName) || IsReservedFolderName(activeName)) {
+    failures.Add("The music was not switched: \"" +
+                 (IsReservedFolderName(chosenName) ? chosenName : activeName) +
+                 "\" is a folder the game or this program needs, not a music set.");
+    return false;
+  }
   if (!IsMusicSetName(activeName)) {
     failures.Add("The music was not switched: no current music set is known (every set listed "
                  "in Music.ini has a folder of its own).");

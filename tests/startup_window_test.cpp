@@ -125,3 +125,19 @@ TEST(StartupWindow, SecondInstanceIsRefusedAndTouchesNoFile) {
   EXPECT_EQ(buttons, 1);
   EXPECT_TRUE(fs::is_empty(game.Path()));
 }
+
+TEST(StartupWindow, AHugeCategoryFileGivesABoxThatFitsTheScreen) {
+  GameFolder game;
+  std::string lines;
+  for (int line = 0; line < 40000; ++line)
+    lines += "no colon, line " + std::to_string(line) + "\r\n";
+  game.WithCategories("Skins: S\r\n" + lines + std::string(10000, 'x') + "\r\n");
+  WindowDriver driver(game.Path());
+  QApplication::processEvents();
+  const QList<QMessageBox *> boxes = driver.Window().findChildren<QMessageBox *>();
+  ASSERT_EQ(boxes.size(), 1);
+  EXPECT_LT(boxes[0]->sizeHint().height(), 700);
+  EXPECT_LT(boxes[0]->sizeHint().width(), 1400);
+  EXPECT_TRUE(boxes[0]->text().endsWith("... and 39990 more."));
+  EXPECT_EQ(driver.Find<QListWidget>("List3")->count(), 3);
+}

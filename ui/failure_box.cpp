@@ -7,20 +7,30 @@
 
 namespace {
 
-// A long list shows its first lines; the whole list is under "Show Details".
+// A long list shows its first lines, each cut to a screen's width; the whole list is under
+// "Show Details", up to a length a text box still handles at once.
 constexpr size_t kShownLines = 12;
+constexpr qsizetype kShownWidth = 160;
+constexpr size_t kDetailLines = 5000;
+
+QString Shown(const std::string &line) {
+  const QString text = FromName(line);
+  return text.size() > kShownWidth ? text.left(kShownWidth) + "..." : text;
+}
 
 // A box with `heading`, the first of `lines`, and all of them under "Show Details".
 QMessageBox *ListBox(QWidget *parent, QMessageBox::Icon icon, const std::string &heading,
                      const std::vector<std::string> &lines, QMessageBox::StandardButtons buttons) {
   QString text = FromName(heading);
   for (size_t i = 0; i < lines.size() && i < kShownLines; ++i)
-    text += "\n" + FromName(lines[i]);
+    text += "\n" + Shown(lines[i]);
   if (lines.size() > kShownLines) {
     text += QString("\n... and %1 more.").arg(lines.size() - kShownLines);
     QString details = FromName(heading);
-    for (const std::string &line : lines)
-      details += "\n" + FromName(line);
+    for (size_t i = 0; i < lines.size() && i < kDetailLines; ++i)
+      details += "\n" + FromName(lines[i]);
+    if (lines.size() > kDetailLines)
+      details += QString("\n... and %1 more.").arg(lines.size() - kDetailLines);
     auto *box = new QMessageBox(icon, WindowCaptionText().simplified(), text, buttons, parent);
     box->setDetailedText(details);
     return box;

@@ -1,0 +1,56 @@
+#include "app/selector.h"
+#include "tests/game_folder.h"
+
+#include <gtest/gtest.h>
+
+namespace {
+
+class Refusals : public ::testing::Test {
+protected:
+  GameFolder game;
+  RecordingCaption caption;
+  NotingStarter starter;
+  Selector selector{game.Path(), caption, starter};
+  Failures failures;
+};
+
+} // namespace
+
+TEST_F(Refusals, AFileTooLargeToBeSettingsIsNamedAndLeftAlone) {
+  const std::string empties((1 << 20) + 1, '\n');
+  game.Write("eaw.ini", empties);
+  EXPECT_FALSE(selector.ReadSettings(failures)[0]);
+  selector.SaveSettings({"1024"}, failures);
+  EXPECT_EQ(game.Read("eaw.ini"), empties);
+  ASSERT_FALSE(failures.Empty());
+  EXPECT_NE(failures.Lines()[0].find("eaw.ini: was not read: it is 1024 KB"), std::string::npos);
+}
+
+TEST_F(Refusals, FoldersTheGameNeedsAreNoMusicSets) {
+  game.Write("Music.ini", "zep128\r\nSAVEDATA\r\nmusic\r\nSet1\r\nSet2\r\n");
+  game.Write("ZEP128/zep.ini", "Skins: S\r\n");
+  game.Write("Savedata/a.sve");
+  game.Write("Set1/a.bgm");
+  game.Write("Music/b.bgm");
+  const MusicList music = selector.MusicSets(failures);
+  EXPECT_EQ(music.entries, std::vector<std::string>{"Set1"});
+  EXPECT_EQ(music.current, "Set2");
+  EXPECT_FALSE(selector.SwitchMusic("Set2", "zep128", failures));
+  EXPECT_FALSE(selector.SwitchMusic("Savedata", "Set1", failures));
+  EXPECT_TRUE(game.Exists("ZEP128/zep.ini"));
+  EXPECT_TRUE(game.Exists("Savedata/a.sve"));
+  EXPECT_TRUE(game.Exists("Music/b.bgm"));
+  ASSERT_EQ(failures.Lines().size(), 2u);
+  EXPECT_NE(failures.Lines()[0].find("\"zep128\" is a folder the game or this program needs"),
+            std::string::npos);
+}
+
+TEST_F(Refusals, NamesOfTheLongestLengthAreLoaded) {
+  const std::string name = std::string(246, 'n') + ".dat";
+  game.WithCategories("Skins: S\r\n");
+  game.Write("ZEP128/S-Long/" + name, "long");
+  selector.StartUp(failures);
+  selector.ClickRow(1, failures);
+  EXPECT_EQ(game.Read(name), "long");
+  EXPECT_TRUE(failures.Empty()) << failures.Message("");
+}
