@@ -107,3 +107,11 @@ std::string ToWindows1252(std::string_view utf8) {
 std::string TextAsUtf8(std::string_view bytes) {
   return IsUtf8(bytes) ? std::string(bytes) : Windows1252ToUtf8(bytes);
 }
+
+std::string NameFromText(std::string_view bytes) {
+#ifdef _WIN32
+  return TextAsUtf8(bytes);
+#else
+  return std::string(bytes);
+#endif
+}

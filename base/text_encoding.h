@@ -19,3 +19,6 @@ std::string ToWindows1252(std::string_view utf8);
 // Text from a file written on Windows: the bytes when they are valid UTF-8, otherwise read as
 // Windows-1252 (what Notepad and older tools write) and given as UTF-8.
 std::string TextAsUtf8(std::string_view bytes);
+// A file name read from a text file, as the platform keeps names: on Windows, where names are
+// UTF-8 here, Windows-1252 text becomes UTF-8; elsewhere the bytes are the name.
+std::string NameFromText(std::string_view bytes);

@@ -46,7 +46,9 @@ MusicList FillMusicList(const fs::path &eawDir, Failures &failures) {
     if (!IsMusicSetName(line))
       continue;
     // Names are bytes; a Music.ini written in Windows-1252 names UTF-8 folders as text.
-    const std::string name = hasFolder(line) ? line : TextAsUtf8(line);
+    const std::string text = TextAsUtf8(line);
+    const std::string name =
+        hasFolder(line) ? line : (hasFolder(text) ? text : NameFromText(line));
     if (hasFolder(name))
       list.entries.push_back(name);
     else

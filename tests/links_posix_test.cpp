@@ -1,3 +1,4 @@
+#include "app/category_file.h"
 #include "app/selector.h"
 #include "tests/game_folder.h"
 
@@ -44,13 +45,17 @@ protected:
 TEST_F(Links, TemporaryNamesPlantedAsLinksAreNeverWrittenThrough) {
   for (const char *name :
        {"planes.dat.partial", "ZEP128/FoldersLoaded.txt.partial", "eaw.ini.partial",
-        "ZEP128/#Selector/loaded.txt.partial", "ZEP128/#Selector/journal.txt.partial"}) {
+        "ZEP128/#Selector/loaded.txt.partial", "ZEP128/#Selector/journal.txt.partial",
+        "ZEP128/#Selector/music.txt.partial", "ZEP128/zep.ini.partial"}) {
     game.MakeFolder("ZEP128/#Selector");
     ASSERT_TRUE(Plant(name)) << name;
   }
   selector.ClickRow(1, failures);
   selector.SaveSettings({"1024"}, failures);
   EXPECT_TRUE(selector.SwitchMusic("Set2", "Set1", failures));
+  fs::remove(game.Path() / "ZEP128/zep.ini");
+  selector.RefreshLibrary(failures);
+  EXPECT_EQ(game.Read("ZEP128/zep.ini"), DefaultCategoryText());
   EXPECT_EQ(game.Read("planes.dat"), "planes.dat");
   EXPECT_EQ(game.Record(), "S-One\r\n\r\n");
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1024\r\n");

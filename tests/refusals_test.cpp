@@ -1,4 +1,5 @@
 #include "app/selector.h"
+#include "base/new_file.h"
 #include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
@@ -53,4 +54,10 @@ TEST_F(Refusals, NamesOfTheLongestLengthAreLoaded) {
   selector.ClickRow(1, failures);
   EXPECT_EQ(game.Read(name), "long");
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
+}
+
+TEST(Reasons, AFullDiskIsCalledSo) {
+  EXPECT_EQ(ReasonOf(std::make_error_code(std::errc::no_space_on_device)), "the disk is full");
+  EXPECT_EQ(ReasonOf(std::make_error_code(std::errc::permission_denied)),
+            std::make_error_code(std::errc::permission_denied).message());
 }

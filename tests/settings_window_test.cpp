@@ -102,6 +102,22 @@ TEST(SettingsWindow, MusicListSwitchesThereAndBack) {
   EXPECT_EQ(current->text(), "Rock");
 }
 
+TEST(SettingsWindow, MusicSetNamesThatAreNotTextKeepTheirBytes) {
+  GameFolder game;
+  const std::string latin1 = "Kl\xE4nge";
+  game.Write("Music.ini", latin1 + "\r\nRock\r\n");
+  game.Write("Music/rock.bgm");
+  game.Write(latin1 + "/klang.bgm");
+  WindowDriver driver(game.Path());
+  auto *list = driver.Find<QListWidget>("List4");
+  for (int time = 0; time < 2; ++time)
+    QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
+                      list->visualItemRect(list->item(0)).center());
+  EXPECT_TRUE(game.Exists(latin1 + "/klang.bgm"));
+  EXPECT_TRUE(game.Exists("Music/rock.bgm"));
+  EXPECT_TRUE(driver.TakeMessages().isEmpty());
+}
+
 TEST(SettingsWindow, FlyStartsTheGameEachTimeOrSaysWhyNot) {
   GameFolder game;
   WindowDriver driver(game.Path());

@@ -265,10 +265,14 @@ void MainWindow::FillMusicList() {
   Failures failures;
   const MusicList music = selector_.MusicSets(failures);
   c_.List4->clear();
+  // A name that is not valid text would not survive the list's text: its bytes go beside it.
   for (const std::string &name : music.entries)
-    c_.List4->addItem(FromName(name));
-  if (music.current)
+    (new QListWidgetItem(FromName(name), c_.List4))
+        ->setData(Qt::UserRole, QByteArray::fromStdString(name));
+  if (music.current) {
+    currentMusic_ = *music.current;
     c_.Label11->setText(FromName(*music.current));
+  }
   ShowFailures(this, failures, "The music sets could not be read:");
 }
 
@@ -276,7 +280,8 @@ void MainWindow::List4_Click(QListWidgetItem *item) {
   Failures failures;
   {
     const InputBlocker blocker;
-    selector_.SwitchMusic(ToName(c_.Label11->text()), ToName(item->text()), failures);
+    selector_.SwitchMusic(currentMusic_, item->data(Qt::UserRole).toByteArray().toStdString(),
+                          failures);
   }
   FillMusicList();
   ShowFailures(this, failures, "The music could not be switched:");

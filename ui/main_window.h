@@ -57,4 +57,5 @@ private:
   bool editorWindows1252_ = false; // the eaw.ini editor's text came from Windows-1252 bytes
   QString editorShown_;            // the text the editor was given
   QString editorShownPlain_;       // the same as the editor gives it back
+  std::string currentMusic_;       // the music set Label11 shows, byte for byte
 };
