@@ -33,6 +33,10 @@ public:
   std::string ClickRow(int row, Failures &failures);
   // A key pressed on grid row `row`: Enter acts as a click.
   std::string PressKey(int row, int key, Failures &failures);
+  // The next shown row from `from` on whose name starts with the typed `prefix`; 0 for none.
+  int FindRow(int from, const std::string &prefix) const {
+    return state_.Unigrid.FindShownRow(from, prefix);
+  }
   // Rebuilds the grid from the library on disk, keeping the loaded marks.
   void RefreshLibrary(Failures &failures);
   // The game-folder files that Reset All would delete, for the player to agree to.

@@ -3,6 +3,7 @@
 #include <cstdint>
 #include <filesystem>
 #include <string>
+#include <string_view>
 #include <vector>
 
 // OLE colour (&HBBGGRR) of a loaded row's name cell: light green.
@@ -44,6 +45,9 @@ struct FolderGrid {
   const GridRow &Row(int row) const { return rows[static_cast<size_t>(row)]; }
   // Whether `row` is a folder row (not the header row, not past the end).
   bool IsFolderRow(int row) const { return row >= 1 && row < RowCount(); }
+  // The first shown folder row from `from` on, going round past the end, whose name starts with
+  // `prefix` in any letter case; 0 when there is none.
+  int FindShownRow(int from, std::string_view prefix) const;
   // Makes (row, column 1) the current cell and gives it `colour`.
   void ColourRow(int row, std::uint32_t colour);
   // Drops every folder row; the header row stays.

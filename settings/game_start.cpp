@@ -17,7 +17,7 @@ void StartGame(const fs::path &eawDir, ProgramStarter &starter, Failures &failur
   const fs::path program = FindAnyCase(eawDir, "eaw.exe");
   FileCheck(program);
   if (!FileFound)
-    failures.Add("The game cannot be started: " + DisplayPath(program) + " was not found.");
+    failures.Add(DisplayPath(program) + " was not found.");
   else if (!starter.StartDetached(program, IsWindowsProgram(program)))
-    failures.Add("The game cannot be started: " + DisplayPath(program) + " could not be run.");
+    failures.Add(DisplayPath(program) + " could not be run.");
 }

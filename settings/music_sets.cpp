@@ -47,8 +47,7 @@ MusicList FillMusicList(const fs::path &eawDir, Failures &failures) {
       continue;
     // Names are bytes; a Music.ini written in Windows-1252 names UTF-8 folders as text.
     const std::string text = TextAsUtf8(line);
-    const std::string name =
-        hasFolder(line) ? line : (hasFolder(text) ? text : NameFromText(line));
+    const std::string name = hasFolder(line) ? line : (hasFolder(text) ? text : NameFromText(line));
     if (hasFolder(name))
       list.entries.push_back(name);
     else

@@ -1,6 +1,7 @@
 #include "tests/game_folder.h"
 #include "tests/window_driver.h"
 
+#include <QApplication>
 #include <QImage>
 #include <QTest>
 #include <gtest/gtest.h>
@@ -125,4 +126,31 @@ TEST(ViewsWindow, HoverShowsDescriptionAndPictureOfTheRowEntered) {
   EXPECT_EQ(text->toPlainText(), "");
   EXPECT_TRUE(image->pixmap().isNull());
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
+}
+
+TEST(ViewsWindow, TheSelectedCategoryShowsAgainTypingFindsAShownRowAndLoadedRowsAreBold) {
+  GameFolder game;
+  game.WithCategories("Skins: S\r\nSounds: N\r\n");
+  for (const char *name : {"S-alpha", "S-beta", "N-bravo"})
+    game.MakeFolder(std::string("ZEP128/") + name);
+  WindowDriver driver(game.Path());
+  ChooseCategory(driver, 2);
+  QTest::mouseClick(driver.Find<QLabel>("Label33"), Qt::LeftButton);
+  EXPECT_EQ(ShownFolders(driver).size(), 3);
+  ChooseCategory(driver, 2);
+  EXPECT_EQ(ShownFolders(driver), (QStringList{"S-alpha", "S-beta"}));
+
+  QTableView *grid = driver.Grid();
+  grid->setFocus();
+  QTest::keyClicks(grid, "S-b");
+  EXPECT_EQ(grid->currentIndex().data().toString(), "S-beta");
+  QTest::qWait(QApplication::keyboardInputInterval() + 50);
+  QTest::keyClicks(grid, "N");
+  EXPECT_EQ(grid->currentIndex().data().toString(), "S-beta");
+
+  driver.ClickRow(2);
+  const QModelIndex loaded = grid->model()->index(1, 1);
+  EXPECT_TRUE(loaded.data(Qt::FontRole).value<QFont>().bold());
+  EXPECT_FALSE(grid->model()->index(0, 1).data(Qt::FontRole).isValid());
+  EXPECT_EQ(loaded.data(Qt::ToolTipRole).toString(), "S-beta");
 }

@@ -3,6 +3,8 @@
 #include "platform/qt_paths.h"
 #include "ui/twips.h"
 
+#include <QFont>
+
 FolderGridModel::FolderGridModel(const FolderGrid &grid, QObject *parent)
     : QAbstractTableModel(parent), grid_(grid) {}
 
@@ -28,8 +30,19 @@ QVariant FolderGridModel::data(const QModelIndex &index, int role) const {
       return QString::fromStdString(row.mark);
     }
   }
-  if (role == Qt::BackgroundRole && index.column() == 1 && row.nameColour != 0)
+  if (index.column() != 1)
+    return {};
+  if (role == Qt::BackgroundRole && row.nameColour != 0)
     return FromOle(row.nameColour);
+  // A name too long for its column is read whole in the tooltip.
+  if (role == Qt::ToolTipRole)
+    return FromName(row.name);
+  // Loaded rows are bold as well as green: pale green is hard to tell from white on many screens.
+  if (role == Qt::FontRole && IsLoaded(row)) {
+    QFont bold;
+    bold.setBold(true);
+    return bold;
+  }
   return {};
 }
 

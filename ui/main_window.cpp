@@ -11,6 +11,7 @@
 #include "ui/twips.h"
 #include "ui/window_icon.h"
 
+#include <QApplication>
 #include <QGuiApplication>
 #include <QHeaderView>
 #include <QKeyEvent>
@@ -41,6 +42,9 @@ void MainWindow::WireEvents() {
   connect(c_.Command1, &QPushButton::clicked, this, &MainWindow::Command1_Click);
   connect(c_.Unigrid, &QTableView::clicked, this, &MainWindow::Unigrid_Click);
   connect(c_.List3, &QListWidget::currentRowChanged, this, &MainWindow::List3_Click);
+  // A click on the entry already selected shows its view again (after a Refresh, say).
+  connect(c_.List3, &QListWidget::itemClicked, this,
+          [this](QListWidgetItem *item) { List3_Click(c_.List3->row(item)); });
   connect(c_.IniEdit, &QPushButton::clicked, this, &MainWindow::IniEdit_Click);
   connect(c_.InSaver, &QPushButton::clicked, this, &MainWindow::InSaver_Click);
   connect(c_.List4, &QListWidget::itemClicked, this, &MainWindow::List4_Click);
@@ -82,8 +86,10 @@ void MainWindow::WireHooks() {
         Unigrid_KeyPress(kEnterKey);
       return true;
     }
-    // Typed characters do nothing; arrow keys still move the current row.
-    return !key->text().isEmpty();
+    if (key->text().isEmpty() || !key->text()[0].isPrint())
+      return false;
+    Unigrid_Type(key->text());
+    return true;
   });
   OnEvents(c_.Frame21, [this](QEvent *event) {
     if (event->type() == QEvent::MouseButtonRelease || event->type() == QEvent::MouseButtonDblClick)
@@ -197,6 +203,19 @@ void MainWindow::Unigrid_KeyPress(int key) {
   ShowGridChanges();
   ShowFailures(this, failures, "Some files could not be handled:");
   ShowNotice(this, notice);
+}
+
+// Typed letters go to the next shown row whose name starts with them, as in any list; the same
+// letter typed again goes on to the next such row.
+void MainWindow::Unigrid_Type(const QString &text) {
+  if (!typedSince_.isValid() || typedSince_.elapsed() > QApplication::keyboardInputInterval())
+    typed_.clear();
+  typedSince_.restart();
+  typed_ += text;
+  const int current = c_.Unigrid->currentIndex().row() + 1;
+  const int row = selector_.FindRow(typed_.size() == 1 ? current + 1 : current, ToName(typed_));
+  if (row > 0)
+    c_.Unigrid->setCurrentIndex(gridModel_->index(row - 1, 1));
 }
 
 void MainWindow::Unigrid_MouseMove(int row) {

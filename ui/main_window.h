@@ -5,6 +5,7 @@
 #include "ui/window_caption.h"
 #include "ui/window_layout.h"
 
+#include <QElapsedTimer>
 #include <QWidget>
 #include <filesystem>
 
@@ -33,6 +34,7 @@ private:
   void Unigrid_Click(const QModelIndex &index);
   void Unigrid_KeyPress(int key);
   void Unigrid_MouseMove(int row);
+  void Unigrid_Type(const QString &text);
   void IniRead();
   void inisave();
   void IniEdit_Click();
@@ -58,4 +60,6 @@ private:
   QString editorShown_;            // the text the editor was given
   QString editorShownPlain_;       // the same as the editor gives it back
   std::string currentMusic_;       // the music set Label11 shows, byte for byte
+  QString typed_;                  // letters typed into the grid in quick succession
+  QElapsedTimer typedSince_;
 };
