@@ -4,7 +4,7 @@ set -euo pipefail
 cd "$(dirname "$0")/.."
 bash scripts/install_deps.sh
 cmake -S . -B build-demo -DCMAKE_BUILD_TYPE=Release -DSELECTOR_TESTS=OFF
-cmake --build build-demo -j "$(nproc)"
+cmake --build build-demo -j "$(nproc)" --target eawselector make_demo_game
 game="${1:-$PWD/demo-game}"
 build-demo/make_demo_game "$game"
 cp build-demo/eawselector "$game/"
