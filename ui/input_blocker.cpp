@@ -1,14 +1,18 @@
 #include "ui/input_blocker.h"
 
-#include <QCoreApplication>
+#include <QApplication>
 #include <QEvent>
 
-InputBlocker::InputBlocker() { QCoreApplication::instance()->installEventFilter(this); }
+InputBlocker::InputBlocker() {
+  QCoreApplication::instance()->installEventFilter(this);
+  QApplication::setOverrideCursor(Qt::WaitCursor);
+}
 
 InputBlocker::~InputBlocker() {
   // Input held back while the operation ran arrives now and is dropped here.
   QCoreApplication::processEvents();
   QCoreApplication::instance()->removeEventFilter(this);
+  QApplication::restoreOverrideCursor();
 }
 
 bool InputBlocker::eventFilter(QObject *, QEvent *event) {

@@ -2,8 +2,9 @@
 
 #include <QObject>
 
-// Blocks the window while an operation runs: clicks and keys that arrive meanwhile are dropped
-// when it ends, not replayed (a second click on a row would unload what was just loaded).
+// Blocks the window while an operation runs: the pointer shows it is busy, and clicks and keys
+// that arrive meanwhile are dropped when it ends, not replayed (a second click on a row would
+// unload what was just loaded).
 class InputBlocker : public QObject {
 public:
   InputBlocker();
