@@ -1,15 +1,9 @@
-#include "app/selector.h"
 #include "base/names.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
-#include <gtest/gtest.h>
+using GameStart = SelectorTest;
 
-TEST(GameStart, WindowsProgramsAreToldApartAndAMissingGameIsNamed) {
-  GameFolder game;
-  RecordingCaption caption;
-  NotingStarter starter;
-  Selector selector(game.Path(), caption, starter);
-  Failures failures;
+TEST_F(GameStart, WindowsProgramsAreToldApartAndAMissingGameIsNamed) {
   selector.StartGame(failures);
   ASSERT_EQ(failures.Lines().size(), 1u);
   EXPECT_NE(failures.Lines()[0].find("eaw.exe was not found"), std::string::npos);

@@ -1,25 +1,19 @@
 #include "app/selector.h"
 #include "library/grid_click.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
 namespace {
 
 // A Selector on a game folder whose library the test fills before StartUp.
-class GridClick : public ::testing::Test {
+class GridClick : public SelectorTest {
 protected:
   const SelectorState &State() const { return selector.State(); }
   const GridRow &Row(const std::string &name) const {
     return State().Unigrid.Row(RowOf(State().Unigrid, name));
   }
   void Click(const std::string &name) { selector.ClickRow(RowOf(State().Unigrid, name), failures); }
-
-  GameFolder game;
-  RecordingCaption caption;
-  NotingStarter starter;
-  Selector selector{game.Path(), caption, starter};
-  Failures failures;
 };
 
 } // namespace

@@ -1,6 +1,6 @@
 #include "app/category_file.h"
 #include "app/selector.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
@@ -9,7 +9,7 @@ namespace fs = std::filesystem;
 namespace {
 
 // A game with one loadable folder, and a file outside the game folder that links point at.
-class Links : public ::testing::Test {
+class Links : public SelectorTest {
 protected:
   void SetUp() override {
     game.WithGameFolders().WithCategories("Skins: S\r\n").WithRecord("");
@@ -31,13 +31,8 @@ protected:
     EXPECT_TRUE(IsWritable(outside.Path() / "target.txt") == outsideWritable);
   }
 
-  GameFolder game;
   TestFolder outside;
   bool outsideWritable = true;
-  RecordingCaption caption;
-  NotingStarter starter;
-  Selector selector{game.Path(), caption, starter};
-  Failures failures;
 };
 
 } // namespace

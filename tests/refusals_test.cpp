@@ -1,21 +1,10 @@
 #include "app/selector.h"
 #include "base/new_file.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
-namespace {
-
-class Refusals : public ::testing::Test {
-protected:
-  GameFolder game;
-  RecordingCaption caption;
-  NotingStarter starter;
-  Selector selector{game.Path(), caption, starter};
-  Failures failures;
-};
-
-} // namespace
+using Refusals = SelectorTest;
 
 TEST_F(Refusals, AFileTooLargeToBeSettingsIsNamedAndLeftAlone) {
   const std::string empties((1 << 20) + 1, '\n');
