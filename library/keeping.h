@@ -42,7 +42,6 @@ public:
   const LoadedFolder *Find(std::string_view name) const;
   void Remove(std::string_view name);
   void Append(LoadedFolder folder) { folders_.push_back(std::move(folder)); }
-  void Clear() { folders_.clear(); }
   const std::vector<LoadedFolder> &Folders() const { return folders_; }
   // For each PlaceKey, the name of the folder loaded last that put such a file into the game.
   std::unordered_map<std::string, std::string> LastProviders() const;
