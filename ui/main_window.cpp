@@ -63,6 +63,9 @@ void MainWindow::WireHooks() {
   OnEvents(c_.LoadFrame, clearOnMove);
   OnEvents(c_.List3->viewport(), clearOnMove);
   OnEvents(c_.Unigrid->viewport(), [this](QEvent *event) {
+    // The slot panel covers the description: it gives way while the pointer is over a row.
+    if (event->type() == QEvent::Leave)
+      c_.SlotFrame->setVisible(State().Slots.frameVisible);
     if (event->type() != QEvent::MouseMove)
       return false;
     const int y = static_cast<QMouseEvent *>(event)->position().toPoint().y();
@@ -144,6 +147,7 @@ void MainWindow::Command3_Click() { close(); }
 void MainWindow::Command8_Click() { showMinimized(); }
 
 void MainWindow::ClearPreview() {
+  c_.SlotFrame->setVisible(State().Slots.frameVisible);
   c_.MyLabel->clear();
   ShowPicture(c_.MyImage, State().BackPic);
 }
@@ -222,6 +226,7 @@ void MainWindow::Unigrid_MouseMove(int row) {
   const std::optional<FolderPreview> preview = selector_.HoverRow(row);
   if (!preview)
     return;
+  c_.SlotFrame->setVisible(State().Slots.frameVisible && row < 1);
   c_.MyLabel->clear();
   c_.Text9->clear();
   ShowPicture(c_.MyImage, State().BackPic);

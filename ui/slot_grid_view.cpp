@@ -22,16 +22,18 @@ void FillSlotGrid(QTableWidget *grid, const SlotPanel &panel, const QColor &head
   const int columns = kSlotColumns;
   grid->clear();
   grid->setColumnCount(columns);
-  grid->setRowCount(1 + static_cast<int>(panel.rows.size()));
+  grid->setRowCount(static_cast<int>(panel.rows.size()));
+  // The header is the view's own, so that it stays in view while the rows scroll.
   for (int column = 0; column < columns; ++column) {
-    SetCell(grid, 0, column, kHeaders[static_cast<size_t>(column)]);
-    grid->item(0, column)->setBackground(headerColour);
+    auto *header = new QTableWidgetItem(kHeaders[static_cast<size_t>(column)]);
+    header->setBackground(headerColour);
+    grid->setHorizontalHeaderItem(column, header);
     const int width = kWidthsTwips[static_cast<size_t>(column)];
     grid->setColumnHidden(column, width == 0);
     if (width > 0)
       grid->setColumnWidth(column, TwipsToPixels(width));
   }
-  int row = 1;
+  int row = 0;
   for (const SlotRow &slot : panel.rows) {
     SetCell(grid, row, 0, FromName(slot.folder));
     SetCell(grid, row, 1, FromName(slot.plnSlot));

@@ -174,7 +174,11 @@ void BuildSlotPanel(QWidget *frame, Controls &c) {
   c.SlotGrid = Make<QTableWidget>(c.SlotFrame, "SlotGrid", Twips(60, 300, 6345, 2475));
   c.SlotGrid->setFont(WindowFont(8));
   c.SlotGrid->verticalHeader()->hide();
-  c.SlotGrid->horizontalHeader()->hide();
+  c.SlotGrid->horizontalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
+  c.SlotGrid->horizontalHeader()->setFixedHeight(TwipsToPixels(240));
+  c.SlotGrid->horizontalHeader()->setStyleSheet(
+      QString("QHeaderView::section { background-color: %1; border: 1px solid #808080; }")
+          .arg(kSlotFrameColour));
   c.SlotGrid->verticalHeader()->setDefaultSectionSize(TwipsToPixels(240));
   c.SlotGrid->setEditTriggers(QAbstractItemView::NoEditTriggers);
   c.SlotFrame->hide();
