@@ -56,9 +56,33 @@ static std::string ReplacedNotice(const std::string &loaded,
          loaded + "\" puts their files back.";
 }
 
+// "120 files copied, 2 deleted, 1 put back": what an operation did, for the player to see.
+static std::string TallyText(const Tally &tally) {
+  std::string text;
+  const auto add = [&](int count, const char *what) {
+    if (count == 0)
+      return;
+    text += (text.empty() ? "" : ", ") + std::to_string(count) +
+            (text.empty() ? (count == 1 ? " file " : " files ") : " ") + what;
+  };
+  add(tally.copied, "copied");
+  add(tally.removed, "deleted");
+  add(tally.restored, "put back");
+  return text.empty() ? "no file changed" : text;
+}
+
 std::string Selector::ClickRow(int row, Failures &failures) {
+  state_.tally = {};
+  state_.summary.clear();
+  const bool folderRow = state_.Unigrid.IsFolderRow(row);
+  const bool wasLoaded = folderRow && IsLoaded(state_.Unigrid.Row(row));
   const std::vector<std::string> replaced = ::ClickRow(state_, row, caption_, failures);
-  return replaced.empty() ? "" : ReplacedNotice(state_.Unigrid.Row(row).name, replaced);
+  if (!folderRow || wasLoaded == IsLoaded(state_.Unigrid.Row(row)))
+    return "";
+  const std::string &name = state_.Unigrid.Row(row).name;
+  state_.summary =
+      (wasLoaded ? "Unloaded \"" : "Loaded \"") + name + "\": " + TallyText(state_.tally) + ".";
+  return replaced.empty() ? "" : ReplacedNotice(name, replaced);
 }
 
 std::string Selector::PressKey(int row, int key, Failures &failures) {
@@ -82,7 +106,9 @@ std::vector<std::string> Selector::ResetAllFiles(Failures &failures) const {
 }
 
 void Selector::ResetAll(const std::vector<std::string> &names, Failures &failures) {
+  state_.tally = {};
   ::ResetAll(state_, names, caption_, failures);
+  state_.summary = "Reset All: " + TallyText(state_.tally) + ".";
 }
 
 std::optional<FolderPreview> Selector::HoverRow(int row) {

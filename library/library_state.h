@@ -6,6 +6,13 @@
 #include <cstdint>
 #include <filesystem>
 
+// What the last operation did to the game's files, for the line that sums it up.
+struct Tally {
+  int copied = 0;   // files copied in from a folder being loaded
+  int removed = 0;  // files taken out of the game
+  int restored = 0; // files put back: another loaded folder's copy or a kept original
+};
+
 // What loading, unloading, the record and the grid views share: the paths, the `Ready` flag, the
 // folder grid and the slot panel.
 struct LibraryState {
@@ -15,6 +22,7 @@ struct LibraryState {
   std::uint32_t GridBackColor = 0; // 0 shows as the grid's default white
   FolderGrid Unigrid;
   SlotPanel Slots;
+  Tally tally;
 };
 
 // The library state for the game folder `eawDir`, with `LibDir` (its "ZEP128" in any case).

@@ -52,7 +52,7 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
 
 } // namespace
 
-std::vector<std::string> MoveIn(const LibraryState &state, const fs::path &folder, Caption &caption,
+std::vector<std::string> MoveIn(LibraryState &state, const fs::path &folder, Caption &caption,
                                 Failures &failures) {
   if (!state.Ready || folder == state.EAWDir)
     return {};
@@ -84,6 +84,7 @@ std::vector<std::string> MoveIn(const LibraryState &state, const fs::path &folde
       continue;
     places.Index(target.place).Add(target.name);
     loaded.files.push_back(target);
+    ++state.tally.copied;
     caption.Set("Please wait- copying: :" + NameText(copy.source));
   }
   ledger.Append(std::move(loaded));

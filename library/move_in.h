@@ -15,5 +15,5 @@
 // journal is left at "loaded" for the caller to close once the record is written. Does nothing
 // while `Ready` is false or when `folder` is the game folder. A file that cannot be copied is
 // skipped and recorded in `failures`. Returns the loaded folders whose files it replaced.
-std::vector<std::string> MoveIn(const LibraryState &state, const std::filesystem::path &folder,
+std::vector<std::string> MoveIn(LibraryState &state, const std::filesystem::path &folder,
                                 Caption &caption, Failures &failures);

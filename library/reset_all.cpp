@@ -45,17 +45,19 @@ void DeleteFiles(const fs::path &folder, const std::vector<std::string> &names,
     RemoveFile(Child(folder, name), failures);
 }
 
-void CleanUp(const LibraryState &state, const std::vector<std::string> &names, Failures &failures) {
+void CleanUp(LibraryState &state, const std::vector<std::string> &names, Failures &failures) {
   std::vector<std::string> present;
   for (const std::string &name : names) {
     FileCheck(Child(state.EAWDir, name));
     if (FileFound)
       present.push_back(name);
   }
+  const size_t before = failures.Lines().size();
   DeleteFiles(state.EAWDir, present, failures);
+  state.tally.removed += static_cast<int>(present.size() - (failures.Lines().size() - before));
 }
 
-void RestoreOriginals(const LibraryState &state, Failures &failures) {
+void RestoreOriginals(LibraryState &state, Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
   GamePlaces places(state.EAWDir);
   for (const Place place : {Place::Game, Place::Savedata, Place::Music}) {
@@ -66,7 +68,8 @@ void RestoreOriginals(const LibraryState &state, Failures &failures) {
       FileCheck(target);
       if (IsSaveFile(name) && FileFound)
         continue;
-      MoveReplacing(Child(kept, name), target, failures);
+      if (MoveReplacing(Child(kept, name), target, failures))
+        ++state.tally.restored;
     }
   }
 }

@@ -25,10 +25,10 @@ std::vector<std::string> CleanUpNames(const LibraryState &state, Failures &failu
 void DeleteFiles(const std::filesystem::path &folder, const std::vector<std::string> &names,
                  Failures &failures);
 // Deletes the named add-on files (found by CleanUpNames) that are still in the game folder.
-void CleanUp(const LibraryState &state, const std::vector<std::string> &names, Failures &failures);
+void CleanUp(LibraryState &state, const std::vector<std::string> &names, Failures &failures);
 // Puts every original in the keeping folder back into the game; a saved game of the same name
 // that the game has again stays, and so does its original.
-void RestoreOriginals(const LibraryState &state, Failures &failures);
+void RestoreOriginals(LibraryState &state, Failures &failures);
 // Ends a Reset All noted in `journal`: deletes its files unless that was done, puts the originals
 // back, empties the ledger and the record and closes the journal. Also ends one that was
 // interrupted.

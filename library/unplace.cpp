@@ -18,7 +18,7 @@ static std::unordered_set<std::string> KeptOriginals(const fs::path &keeping) {
   return kept;
 }
 
-void UnplaceFiles(const LibraryState &state, const Ledger &ledger,
+void UnplaceFiles(LibraryState &state, const Ledger &ledger,
                   const std::vector<Journal::Entry> &entries, bool afterCrash, Caption &caption,
                   Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
@@ -39,13 +39,16 @@ void UnplaceFiles(const LibraryState &state, const Ledger &ledger,
     const auto provider = providers.find(key);
     if (provider != providers.end()) {
       caption.Set("Please wait- copying: :" + file.name);
-      CopyReplacing(FindAnyCase(Child(state.LibDir, provider->second), file.name), target,
-                    failures);
+      if (CopyReplacing(FindAnyCase(Child(state.LibDir, provider->second), file.name), target,
+                        failures))
+        ++state.tally.restored;
     } else if (originalKept) {
-      MoveReplacing(OriginalPath(keeping, file), target, failures);
+      if (MoveReplacing(OriginalPath(keeping, file), target, failures))
+        ++state.tally.restored;
     } else {
       caption.Set("Deleting " + file.name);
-      RemoveFile(target, failures);
+      if (RemoveFile(target, failures))
+        ++state.tally.removed;
     }
   }
 }

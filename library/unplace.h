@@ -12,6 +12,6 @@
 // game's kept original, else deleted. Save files stay. An entry whose original is to be kept but
 // is not in the keeping folder yet is still the original and stays too. After a crash,
 // `afterCrash` also removes the temporary copies the interrupted work may have left.
-void UnplaceFiles(const LibraryState &state, const Ledger &ledger,
+void UnplaceFiles(LibraryState &state, const Ledger &ledger,
                   const std::vector<Journal::Entry> &entries, bool afterCrash, Caption &caption,
                   Failures &failures);

@@ -44,6 +44,7 @@ TEST(GridClickWindow, LoadCopiesEachFileToItsPlaceAndUnloadDeletesTheCopies) {
   EXPECT_EQ(Mark(driver, 1), "S");
   EXPECT_EQ(game.Record(), "Q-Mix\r\n\r\n");
   EXPECT_EQ(driver.Window().windowTitle(), caption);
+  EXPECT_EQ(driver.Find<QLabel>("Label22")->text(), "Loaded \"Q-Mix\": 4 files copied.");
 
   driver.ClickRow(1);
   for (const char *copy : {"Savedata/a.MSN", "Music/c.BGM", "d.txt"})
@@ -51,6 +52,7 @@ TEST(GridClickWindow, LoadCopiesEachFileToItsPlaceAndUnloadDeletesTheCopies) {
   EXPECT_TRUE(game.Exists("Savedata/b.sve"));
   EXPECT_EQ(Mark(driver, 1), "");
   EXPECT_EQ(game.Record(), "\r\n");
+  EXPECT_EQ(driver.Find<QLabel>("Label22")->text(), "Unloaded \"Q-Mix\": 3 files deleted.");
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 }
 

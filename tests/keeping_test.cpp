@@ -68,6 +68,7 @@ TEST_F(Keeping, AnUnloadPutsBackTheFileOfTheFolderLoadedLast) {
 
 TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
   Click("N-A");
+  EXPECT_EQ(selector->State().summary, "Loaded \"N-A\": 3 files copied.");
   EXPECT_EQ(game.Read("bases.dat"), "bases of A");
   EXPECT_EQ(game.Read("Savedata/a.msn"), "mission of A");
   Restart(); // the kept originals outlast the program
@@ -76,6 +77,7 @@ TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
   EXPECT_EQ(game.Read("bases.dat"), "bases of B");
   EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
   Click("N-B");
+  EXPECT_EQ(selector->State().summary, "Unloaded \"N-B\": 1 file deleted, 1 put back.");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
 
   Click("N-A");
@@ -83,6 +85,7 @@ TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
   const std::vector<std::string> names = selector->ResetAllFiles(failures);
   EXPECT_EQ(names, (std::vector<std::string>{"bases.dat", "sky.spt"}));
   selector->ResetAll(names, failures);
+  EXPECT_EQ(selector->State().summary, "Reset All: 2 files deleted, 2 put back.");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
   EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
   EXPECT_FALSE(game.Exists("sky.spt"));

@@ -31,6 +31,8 @@ MainWindow::MainWindow(const fs::path &eawDir)
   c_.Unigrid->setModel(gridModel_);
   WireEvents();
   WireHooks();
+  summaryShown_.setSingleShot(true);
+  connect(&summaryShown_, &QTimer::timeout, this, [this] { c_.Label22->setText(kInstructions); });
 }
 
 // The widgets outlive the state they show by a moment: detach the grid from it first.
@@ -178,6 +180,7 @@ void MainWindow::Command1_Click() {
     const InputBlocker blocker;
     selector_.ResetAll(names, failures);
   }
+  ShowSummary();
   ShowGridChanges();
   ShowFailures(this, failures, "Reset All could not delete these files:");
 }
@@ -189,6 +192,7 @@ void MainWindow::Unigrid_Click(const QModelIndex &index) {
     const InputBlocker blocker;
     notice = selector_.ClickRow(index.row() + 1, failures);
   }
+  ShowSummary();
   ShowGridChanges();
   ShowFailures(this, failures, "Some files could not be handled:");
   ShowNotice(this, notice);
@@ -204,6 +208,7 @@ void MainWindow::Unigrid_KeyPress(int key) {
     const InputBlocker blocker;
     notice = selector_.PressKey(current.row() + 1, key, failures);
   }
+  ShowSummary();
   ShowGridChanges();
   ShowFailures(this, failures, "Some files could not be handled:");
   ShowNotice(this, notice);
@@ -315,6 +320,15 @@ void MainWindow::delmsn_Click() {
   Failures failures;
   selector_.StartGame(failures);
   ShowFailures(this, failures, "The game could not be started:");
+}
+
+// The line that sums up a load, unload or Reset All takes the place of the instructions above
+// the category list for a few seconds, or until the next one.
+void MainWindow::ShowSummary() {
+  if (State().summary.empty())
+    return;
+  c_.Label22->setText(FromName(State().summary));
+  summaryShown_.start(kSummarySeconds * 1000);
 }
 
 void MainWindow::ShowGridRows() {

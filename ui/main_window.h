@@ -6,10 +6,14 @@
 #include "ui/window_layout.h"
 
 #include <QElapsedTimer>
+#include <QTimer>
 #include <QWidget>
 #include <filesystem>
 
 class FolderGridModel;
+
+// How long the line that sums up an operation stays in view.
+inline constexpr int kSummarySeconds = 6;
 
 // The program's one window: builds its controls, forwards their events to the Selector's verbs
 // and draws the Selector's state.
@@ -43,6 +47,7 @@ private:
   void List4_Click(QListWidgetItem *item);
   void delmsn_Click();
   void ShowScreenSize();
+  void ShowSummary();
   void ShowGridRows();
   void ShowGridChanges();
   void ShowSlotPanel();
@@ -60,6 +65,7 @@ private:
   QString editorShown_;            // the text the editor was given
   QString editorShownPlain_;       // the same as the editor gives it back
   std::string currentMusic_;       // the music set Label11 shows, byte for byte
+  QTimer summaryShown_;            // how long the summary line stays
   QString typed_;                  // letters typed into the grid in quick succession
   QElapsedTimer typedSince_;
 };

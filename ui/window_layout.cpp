@@ -188,9 +188,7 @@ void BuildLoaderPage(QWidget *page, QPoint origin, Controls &c) {
   c.LoadFrame = Make<QFrame>(page, "LoadFrame", Twips(270, 660, 14370, 8415), origin);
   c.LoadFrame->setMouseTracking(true);
   QWidget *f = c.LoadFrame;
-  c.Label22 = MakeLabel(
-      f, "Label22", "Click on a white row to load a folder, or click on a green row to unload it.",
-      Twips(30, 180, 3645, 585), {}, Wrap::Yes);
+  c.Label22 = MakeLabel(f, "Label22", kInstructions, Twips(30, 180, 3645, 585), {}, Wrap::Yes);
   c.Label9 = MakeLabel(f, "Label9", "Code letter", Twips(120, 900, 885, 255));
   c.Label6 = MakeLabel(f, "Label6", "", Twips(990, 840, 465, 315));
   c.Label33 = MakeLabel(f, "Label33", "Refresh!", Twips(1590, 810, 1125, 375));

@@ -42,6 +42,10 @@ struct Controls {
   QTableWidget *SlotGrid;
 };
 
+// The instructions above the category list, which a summary line replaces for a while.
+inline constexpr char kInstructions[] =
+    "Click on a white row to load a folder, or click on a green row to unload it.";
+
 // The slot panel's colour, also the colour of the slot grid's header cells.
 inline constexpr char kSlotFrameColour[] = "#E0E0E0";
 
