@@ -8,6 +8,9 @@ public:
   virtual ~Caption() = default;
   virtual std::string Get() const = 0;
   virtual void Set(const std::string &text) = 0;
+  // How far a long operation is: file `done` of `total`. Shown beside the caption, whose text
+  // stays as it is; a caption that cannot show it ignores it.
+  virtual void Progress(int /*done*/, int /*total*/) {}
 };
 
 // Restores the caption it found when it goes out of scope.

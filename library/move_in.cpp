@@ -73,7 +73,9 @@ std::vector<std::string> MoveIn(LibraryState &state, const fs::path &folder, Cap
     return {};
   }
   LoadedFolder loaded{name, {}};
+  int done = 0;
   for (const Copy &copy : copies) {
+    caption.Progress(++done, static_cast<int>(copies.size()));
     const PlacedFile &target = copy.entry.file;
     const fs::path destination = Child(places.Folder(target.place), target.name);
     // The game's own file goes into safekeeping first; one that cannot is not overwritten.

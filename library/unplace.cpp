@@ -25,7 +25,9 @@ void UnplaceFiles(LibraryState &state, const Ledger &ledger,
   const auto providers = ledger.LastProviders();
   const std::unordered_set<std::string> kept = KeptOriginals(keeping);
   GamePlaces places(state.EAWDir);
+  int done = 0;
   for (const Journal::Entry &entry : entries) {
+    caption.Progress(++done, static_cast<int>(entries.size()));
     const PlacedFile &file = entry.file;
     if (IsSaveFile(file.name))
       continue;

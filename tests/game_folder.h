@@ -9,6 +9,7 @@
 #include <filesystem>
 #include <initializer_list>
 #include <string>
+#include <utility>
 #include <vector>
 
 // A temporary game folder with a library below it, built up by the tests.
@@ -35,9 +36,11 @@ public:
     text = newText;
     shown.push_back(newText);
   }
+  void Progress(int done, int total) override { progress.emplace_back(done, total); }
   bool Showed(const std::string &line) const;
   std::string text = "Selector";
   std::vector<std::string> shown;
+  std::vector<std::pair<int, int>> progress;
 };
 
 // A starter that only notes what it was asked to start.

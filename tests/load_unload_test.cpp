@@ -48,6 +48,8 @@ TEST(MoveIn, PutsEachFileWhereTheGameLooksForIt) {
        {"mypic", "Contents.TXT", "eca_note.dat", "model.ldr", "pic.jpg", "skin.PCX", "anim.gif"})
     EXPECT_FALSE(game.folder.Exists(kept)) << kept;
   EXPECT_TRUE(game.Shown("Please wait- copying: :readme.txt"));
+  ASSERT_EQ(game.caption.progress.size(), 5u);
+  EXPECT_EQ(game.caption.progress.back(), std::make_pair(5, 5));
   EXPECT_EQ(game.caption.text, "Selector");
   EXPECT_TRUE(game.failures.Empty());
 }

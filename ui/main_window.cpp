@@ -23,7 +23,7 @@
 namespace fs = std::filesystem;
 
 MainWindow::MainWindow(const fs::path &eawDir)
-    : c_(BuildControls(this)), caption_(this), selector_(eawDir, caption_, starter_),
+    : c_(BuildControls(this)), caption_(this, c_.Label22), selector_(eawDir, caption_, starter_),
       gridModel_(new FolderGridModel(selector_.State().Unigrid, this)) {
   setObjectName("ZEPForm");
   setWindowTitle(WindowCaptionText());
@@ -325,8 +325,10 @@ void MainWindow::delmsn_Click() {
 // The line that sums up a load, unload or Reset All takes the place of the instructions above
 // the category list for a few seconds, or until the next one.
 void MainWindow::ShowSummary() {
-  if (State().summary.empty())
+  if (State().summary.empty()) {
+    c_.Label22->setText(kInstructions);
     return;
+  }
   c_.Label22->setText(FromName(State().summary));
   summaryShown_.start(kSummarySeconds * 1000);
 }
