@@ -32,7 +32,7 @@ void MoveOut(LibraryState &state, const fs::path &folder, Caption &caption, Fail
   if (!state.Ready)
     return;
   if (IsCampaignFolder(folder))
-    CarrySaveFiles(state.EAWDir, folder, failures);
+    CarrySaveFiles(state.EAWDir, folder, caption, failures);
   if (folder == state.EAWDir)
     return;
   CaptionRestorer restorer(caption);

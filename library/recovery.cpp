@@ -44,7 +44,7 @@ void FinishInterrupted(LibraryState &state, Caption &caption, Failures &failures
     break;
   case Journal::Step::Reset:
   case Journal::Step::Restore:
-    FinishReset(state, std::move(*journal), failures);
+    FinishReset(state, std::move(*journal), caption, failures);
     break;
   }
   Journal::Remove(keeping);

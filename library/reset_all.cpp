@@ -39,22 +39,25 @@ std::vector<std::string> CleanUpNames(const LibraryState &state, Failures &failu
   return names;
 }
 
-void DeleteFiles(const fs::path &folder, const std::vector<std::string> &names,
-                 Failures &failures) {
-  for (const std::string &name : names)
-    RemoveFile(Child(folder, name), failures);
+int DeleteFiles(const fs::path &folder, const std::vector<std::string> &names, Caption &caption,
+                Failures &failures) {
+  int deleted = 0;
+  for (size_t done = 0; done < names.size(); ++done) {
+    caption.Progress(static_cast<int>(done + 1), static_cast<int>(names.size()));
+    deleted += RemoveFile(Child(folder, names[done]), failures) ? 1 : 0;
+  }
+  return deleted;
 }
 
-void CleanUp(LibraryState &state, const std::vector<std::string> &names, Failures &failures) {
+void CleanUp(LibraryState &state, const std::vector<std::string> &names, Caption &caption,
+             Failures &failures) {
   std::vector<std::string> present;
   for (const std::string &name : names) {
     FileCheck(Child(state.EAWDir, name));
     if (FileFound)
       present.push_back(name);
   }
-  const size_t before = failures.Lines().size();
-  DeleteFiles(state.EAWDir, present, failures);
-  state.tally.removed += static_cast<int>(present.size() - (failures.Lines().size() - before));
+  state.tally.removed += DeleteFiles(state.EAWDir, present, caption, failures);
 }
 
 void RestoreOriginals(LibraryState &state, Failures &failures) {
@@ -74,13 +77,13 @@ void RestoreOriginals(LibraryState &state, Failures &failures) {
   }
 }
 
-void FinishReset(LibraryState &state, Journal journal, Failures &failures) {
+void FinishReset(LibraryState &state, Journal journal, Caption &caption, Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
   if (journal.step == Journal::Step::Reset) {
     std::vector<std::string> names;
     for (const Journal::Entry &entry : journal.entries)
       names.push_back(entry.file.name);
-    CleanUp(state, names, failures);
+    CleanUp(state, names, caption, failures);
     journal.step = Journal::Step::Restore;
     journal.entries.clear();
     journal.Write(keeping, failures);
@@ -110,7 +113,7 @@ void ResetAll(LibraryState &state, const std::vector<std::string> &names, Captio
     for (const std::string &name : names)
       journal.entries.push_back({{Place::Game, name}, false});
     if (journal.Write(KeepingFolder(state.LibDir), failures))
-      FinishReset(state, std::move(journal), failures);
+      FinishReset(state, std::move(journal), caption, failures);
     else
       failures.Add("Nothing was reset: the program cannot note what it is doing in " +
                    DisplayPath(KeepingFolder(state.LibDir)));

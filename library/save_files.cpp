@@ -15,11 +15,15 @@ bool IsCampaignFolder(const fs::path &folder) {
   return StartsWith(name, "C ") || StartsWith(name, "C-");
 }
 
-void CarrySaveFiles(const fs::path &eawDir, const fs::path &campaign, Failures &failures) {
+void CarrySaveFiles(const fs::path &eawDir, const fs::path &campaign, Caption &caption,
+                    Failures &failures) {
   const fs::path savedata = PlaceFolder(eawDir, Place::Savedata);
   NameIndex campaignFiles(campaign);
   // One listing: each file is tried once, so a file that cannot be moved ends the work.
-  for (const std::string &name : ListFiles(savedata, "*.sve")) {
+  const std::vector<std::string> saves = ListFiles(savedata, "*.sve");
+  int done = 0;
+  for (const std::string &name : saves) {
+    caption.Progress(++done, static_cast<int>(saves.size()));
     const fs::path source = Child(savedata, name);
     const std::string target = campaignFiles.TargetName(name);
     if (!CopyReplacing(source, Child(campaign, target), failures))

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "base/caption.h"
 #include "base/failures.h"
 
 #include <filesystem>
@@ -11,4 +12,4 @@ bool IsCampaignFolder(const std::filesystem::path &folder);
 // "Savedata" only after its copy is complete. A file that cannot be moved stays where it is and is
 // recorded in `failures`; the others are still moved.
 void CarrySaveFiles(const std::filesystem::path &eawDir, const std::filesystem::path &campaign,
-                    Failures &failures);
+                    Caption &caption, Failures &failures);

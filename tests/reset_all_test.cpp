@@ -75,7 +75,7 @@ TEST_F(ResetAll, AFileThatCannotBeDeletedIsSkippedAndNamed) {
   // Something took the file's place after the listing: a folder that is not empty stays put.
   fs::remove(game.Path() / "pic1.bmp");
   game.Write("pic1.bmp/keep.txt");
-  DeleteFiles(state.EAWDir, names, failures);
+  DeleteFiles(state.EAWDir, names, caption, failures);
   EXPECT_FALSE(game.Exists("mypic"));
   EXPECT_FALSE(game.Exists("readme.txt"));
   ASSERT_EQ(failures.Lines().size(), 1u);

@@ -1,6 +1,8 @@
 #include "tests/game_folder.h"
 #include "tests/window_driver.h"
 
+#include <QApplication>
+#include <QStyle>
 #include <QTest>
 #include <gtest/gtest.h>
 
@@ -62,6 +64,10 @@ TEST(SettingsWindow, EditorShowsSavesAndHides) {
   EXPECT_TRUE(editor->isVisible());
   auto *text = driver.Find<QPlainTextEdit>("Text14");
   EXPECT_EQ(text->toPlainText(), "[Screen]\nWidth=800\n");
+  // The editor has the style's own colours, not the window's teal.
+  const QPalette standard = QApplication::style()->standardPalette();
+  EXPECT_EQ(editor->palette().color(QPalette::Window), standard.color(QPalette::Window));
+  EXPECT_EQ(text->palette().color(QPalette::Base), standard.color(QPalette::Base));
 
   QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
   EXPECT_EQ(game.Read("eaw.ini"), "[Screen]\r\nWidth=800\r\n\r\n");

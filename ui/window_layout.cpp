@@ -3,7 +3,9 @@
 #include "ui/twips.h"
 #include "ui/wrapping_button.h"
 
+#include <QApplication>
 #include <QHeaderView>
+#include <QStyle>
 
 #include <algorithm>
 
@@ -136,7 +138,9 @@ void BuildGeneralPage(QWidget *page, QPoint origin, Controls &c) {
   BuildSettingsFrame(page, origin, c);
   c.Frame21 = Make<QGroupBox>(page, "Frame21", Twips(1980, 990, 4395, 8265), origin);
   c.Frame21->setTitle("Click to hide");
-  Paint(c.Frame21, page->palette().color(QPalette::Window));
+  // The editor keeps the style's own grey frame and white text box, not the window's teal.
+  c.Frame21->setPalette(QApplication::style()->standardPalette());
+  c.Frame21->setAutoFillBackground(true);
   c.InSaver = Make<QPushButton>(c.Frame21, "InSaver", Twips(210, 270, 2085, 345));
   c.InSaver->setText("Save ini in EAW Directory");
   c.Text14 = Make<QPlainTextEdit>(c.Frame21, "Text14", Twips(180, 810, 4095, 7275));
