@@ -6,6 +6,7 @@
 #include "ui/run_selector.h"
 
 #include <QApplication>
+#include <QFontInfo>
 #include <QLabel>
 #include <QMessageBox>
 #include <QPlainTextEdit>
@@ -54,6 +55,13 @@ TEST(StartupWindow, WindowHasItsCaptionControlsAndPages) {
   for (const char *name : {"Command1", "Command8", "Command3", "Label33", "List4", "MyImage",
                            "Text9", "MyLabel", "Label11", "Label6", "SlotFrame", "Text14"})
     EXPECT_NE(driver.Find<QWidget>(name), nullptr) << name;
+  // One font everywhere, also inside the frames that have style sheets.
+  const QFontInfo windowFont(window.font());
+  for (const char *name : {"Label5", "Text5", "SlotLabel", "Label9"}) {
+    const QFontInfo font(driver.Find<QWidget>(name)->font());
+    EXPECT_EQ(font.family(), windowFont.family()) << name;
+    EXPECT_EQ(font.pointSizeF(), windowFont.pointSizeF()) << name;
+  }
 }
 
 TEST(StartupWindow, RecordedFoldersShowGreenAfterARestart) {

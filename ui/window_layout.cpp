@@ -241,6 +241,9 @@ QString WindowCaptionText() {
 
 Controls BuildControls(QWidget *window) {
   Controls c{};
+  // Widgets with a style sheet take the application's font, not their window's: both are the
+  // window font, so that every control, and every message box, is drawn in it.
+  QApplication::setFont(WindowFont(8.25));
   window->setFont(WindowFont(8.25));
   window->setFixedSize(TwipsToPixels(14985), TwipsToPixels(9360));
   QPalette palette = window->palette();
