@@ -91,24 +91,6 @@ TEST(GridClickWindow, SingleSelectionSwapsAndMultiSelectionKeepsBoth) {
   EXPECT_TRUE(game.Exists("b.wav"));
 }
 
-TEST(GridClickWindow, CampaignSwapCarriesEverySaveFileIntoTheOtherCampaign) {
-  GameFolder game;
-  game.WithGameFolders().WithCategories("Campaigns: C\r\n");
-  game.Write("ZEP128/C first/first.msn");
-  game.Write("ZEP128/C-second/second.msn");
-  WindowDriver driver(game.Path());
-  driver.ClickRow(1);
-  game.Write("Savedata/pilot1.sve", "career");
-  game.Write("Savedata/PILOT2.SVE", "career 2");
-  driver.ClickRow(2);
-  EXPECT_EQ(game.Read("ZEP128/C first/pilot1.sve"), "career");
-  EXPECT_EQ(game.Read("ZEP128/C first/PILOT2.SVE"), "career 2");
-  EXPECT_FALSE(game.Exists("Savedata/pilot1.sve"));
-  EXPECT_FALSE(game.Exists("Savedata/first.msn"));
-  EXPECT_TRUE(game.Exists("Savedata/second.msn"));
-  EXPECT_EQ(game.Record(), "C-second\r\n\r\n");
-}
-
 TEST(GridClickWindow, FlightModelShowsItsPlaneSetsUntilUnloaded) {
   GameFolder game;
   game.WithGameFolders().WithCategories("Flight models: F\r\n");

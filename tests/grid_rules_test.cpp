@@ -48,19 +48,25 @@ TEST_F(GridRules, ASecondFolderOfALetterKeepsOrUnloadsTheFirst) {
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
-TEST_F(GridRules, UnloadingACampaignCarriesHomeItsSaveFilesOnly) {
+TEST_F(GridRules, ACampaignUnloadedCarriesHomeItsSaveFilesOnly) {
   game.WithGameFolders().WithCategories("Campaigns: C\r\n");
-  game.Write("ZEP128/C-War/war.msn", "war");
+  game.Write("ZEP128/C first/first.msn");
+  game.Write("ZEP128/C-second/second.msn");
   selector.StartUp(failures);
-  Click("C-War");
-  game.Write("Savedata/pilot.sve", "career");
+  Click("C first");
+  game.Write("Savedata/pilot1.sve", "career");
   game.Write("Savedata/mine.msn", "the player's");
-  Click("C-War");
-  EXPECT_EQ(game.Read("ZEP128/C-War/pilot.sve"), "career");
-  EXPECT_FALSE(game.Exists("Savedata/pilot.sve"));
-  EXPECT_FALSE(game.Exists("Savedata/war.msn"));
+  Click("C-second"); // the other campaign is unloaded first
+  EXPECT_EQ(game.Read("ZEP128/C first/pilot1.sve"), "career");
+  EXPECT_FALSE(game.Exists("Savedata/first.msn"));
+  game.Write("Savedata/PILOT2.SVE", "career 2");
+  Click("C-second");
+  EXPECT_EQ(game.Read("ZEP128/C-second/PILOT2.SVE"), "career 2");
+  for (const char *gone : {"Savedata/pilot1.sve", "Savedata/PILOT2.SVE", "Savedata/second.msn",
+                           "ZEP128/C-second/pilot1.sve", "ZEP128/C-second/mine.msn"})
+    EXPECT_FALSE(game.Exists(gone)) << gone;
   EXPECT_EQ(game.Read("Savedata/mine.msn"), "the player's");
-  EXPECT_FALSE(game.Exists("ZEP128/C-War/mine.msn"));
+  EXPECT_EQ(game.Record(), "\r\n");
 }
 
 TEST_F(GridRules, ResetAllHonoursEveryDefaultPattern) {
