@@ -132,6 +132,8 @@ TEST(SettingsWindow, FlyStartsTheGameEachTimeOrSaysWhyNot) {
   const QStringList messages = driver.TakeMessages();
   ASSERT_EQ(messages.size(), 1);
   EXPECT_TRUE(messages[0].contains(QString::fromStdString((game.Path() / "eaw.exe").string())));
+  EXPECT_EQ(messages[0].count("started"), 1); // said once
+
   const fs::path exe = game.Write("eaw.exe", "#!/bin/sh\ntouch \"$(dirname \"$0\")/started-$$\"\n");
   fs::permissions(exe, fs::perms::owner_exec, fs::perm_options::add);
   QTest::mouseClick(fly, Qt::LeftButton);
