@@ -49,18 +49,45 @@ bool MatchesPattern(std::string_view name, std::string_view pattern) {
   return MatchFrom(FoldName(name), FoldName(pattern));
 }
 
-bool MatchesPatternList(std::string_view name, std::string_view patterns) {
-  size_t start = 0;
-  while (start <= patterns.size()) {
-    size_t end = patterns.find(';', start);
-    if (end == std::string_view::npos)
-      end = patterns.size();
-    const std::string_view pattern = patterns.substr(start, end - start);
-    if (!pattern.empty() && MatchesPattern(name, pattern))
-      return true;
-    start = end + 1;
+namespace {
+
+// A ";"-separated pattern list with each pattern folded once, so that matching many names folds
+// each name once and no pattern again.
+class PatternList {
+public:
+  explicit PatternList(std::string_view patterns) {
+    size_t start = 0;
+    while (start <= patterns.size()) {
+      size_t end = patterns.find(';', start);
+      if (end == std::string_view::npos)
+        end = patterns.size();
+      const std::string_view pattern = patterns.substr(start, end - start);
+      if (pattern == "*.*")
+        everything_ = true;
+      else if (!pattern.empty())
+        folded_.push_back(FoldName(pattern));
+      start = end + 1;
+    }
   }
-  return false;
+  bool Matches(std::string_view name) const {
+    if (everything_)
+      return true;
+    if (folded_.empty())
+      return false;
+    const std::string folded = FoldName(name);
+    return std::any_of(folded_.begin(), folded_.end(),
+                       [&](const std::string &pattern) { return MatchFrom(folded, pattern); });
+  }
+
+private:
+  std::vector<std::string> folded_;
+  bool everything_ = false;
+};
+
+} // namespace
+
+bool MatchesPatternList(std::string_view name, std::string_view patterns) {
+  return PatternList(patterns).Matches(name);
 }
 
 static bool IsListedFile(const fs::directory_entry &entry) {
@@ -78,12 +105,13 @@ static bool IsListedFile(const fs::directory_entry &entry) {
 
 std::vector<std::string> ListFiles(const fs::path &folder, std::string_view patterns) {
   std::vector<std::string> names;
+  const PatternList wanted(patterns);
   std::error_code error;
   for (fs::directory_iterator it(folder, error), end; !error && it != end; it.increment(error)) {
     if (!IsListedFile(*it))
       continue;
     std::string name = NameText(it->path());
-    if (MatchesPatternList(name, patterns))
+    if (wanted.Matches(name))
       names.push_back(std::move(name));
   }
   std::sort(names.begin(), names.end(),
