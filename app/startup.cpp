@@ -28,7 +28,7 @@ std::vector<SkippedLine> PrepareLibrary(SelectorState &state, Failures &failures
 
 void BuildGrid(LibraryState &state, Failures &failures) {
   const Categories categories = LibraryCategories(state.LibDir, failures);
-  BuildFolderRows(state.Unigrid, categories.codes, ListFolders(state.LibDir));
+  BuildFolderRows(state.Unigrid, categories.codes, state.LibDir, ListFolderNames(state.LibDir));
 }
 
 fs::path GamePicture(const fs::path &eawDir, const char *name) {

@@ -127,22 +127,28 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
   return true;
 }
 
-bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures) {
+static void AddCopyFailure(const fs::path &source, const fs::path &target,
+                           const std::error_code &error, Failures &failures) {
+  failures.Add(source, "cannot be copied to " + DisplayPath(target) + " (" + ReasonOf(error) + ")");
+}
+
+// Copies `source` over `target` by way of a temporary file beside it, so that the target is
+// either the old file or the whole new one.
+static bool CopyOver(const fs::path &source, const fs::path &target, Failures &failures) {
   const fs::path temporary = PartialPath(target);
   std::error_code error = CopyToNewFile(source, temporary);
-  if (error == std::errc::file_exists) {
+  if (AlreadyExists(error)) {
     // What an interrupted copy left must not block this one.
     RemovePartial(temporary);
     error = CopyToNewFile(source, temporary);
   }
   if (error) {
-    failures.Add(source,
-                 "cannot be copied to " + DisplayPath(target) + " (" + ReasonOf(error) + ")");
+    AddCopyFailure(source, target, error, failures);
     RemovePartial(temporary);
     return false;
   }
 #ifdef _WIN32
-  // Windows refuses to replace a read-only file; a missing target is no failure here.
+  // Windows refuses to replace a read-only file.
   SetFileAttributesW(target.c_str(), FILE_ATTRIBUTE_NORMAL);
 #endif
   fs::rename(temporary, target, error);
@@ -151,11 +157,34 @@ bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &fai
     RemovePartial(temporary);
     return false;
   }
-  // The copy carries the source's attributes, so a normal source leaves nothing to do.
+  return true;
+}
+
+// The copy carries the source's attributes, so a normal source leaves nothing to do.
+static void MakeBothNormal(const fs::path &source, const fs::path &target, Failures &failures) {
   if (!IsNormal(source)) {
     MakeNormal(source, failures);
     MakeNormal(target, failures);
   }
+}
+
+bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures) {
+  if (!CopyOver(source, target, failures))
+    return false;
+  MakeBothNormal(source, target, failures);
+  return true;
+}
+
+bool CopyJournaled(const fs::path &source, const fs::path &target, Failures &failures) {
+  // Only a file to replace needs the temporary, which costs a rename per file.
+  const std::error_code error = CopyToNewFile(source, target);
+  if (AlreadyExists(error))
+    return CopyReplacing(source, target, failures);
+  if (error) {
+    AddCopyFailure(source, target, error, failures);
+    return false;
+  }
+  MakeBothNormal(source, target, failures);
   return true;
 }
 

@@ -22,6 +22,11 @@ bool WriteAtomically(const std::filesystem::path &target, const std::string &byt
 // cannot be changed are reported without undoing the copy.
 bool CopyReplacing(const std::filesystem::path &source, const std::filesystem::path &target,
                    Failures &failures);
+// CopyReplacing for a copy listed in the journal of the operation, whose recovery deletes what a
+// crash left: a name that is still free is written directly, without the temporary file; a failed
+// copy deletes what it wrote.
+bool CopyJournaled(const std::filesystem::path &source, const std::filesystem::path &target,
+                   Failures &failures);
 // Deletes the file `path`, also a read-only one. False when it cannot be deleted: `failures` then
 // names it with `problem` and the reason, and its attributes are as they were.
 bool RemoveFile(const std::filesystem::path &path, Failures &failures,

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <functional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -10,9 +11,16 @@
 bool MatchesPattern(std::string_view name, std::string_view pattern);
 // Whether `name` matches any pattern of a ";"-separated list.
 bool MatchesPatternList(std::string_view name, std::string_view patterns);
+// Calls `visit` with the name of each plain file directly in `folder` (on Windows, not the hidden
+// or system ones), in the order the file system gives them. A folder that cannot be listed gives
+// no names.
+void ForEachFile(const std::filesystem::path &folder,
+                 const std::function<void(std::string &&name)> &visit);
 // Plain file names (no path) directly in `folder` that match the pattern list, in name order.
 // A folder that cannot be listed gives no names.
 std::vector<std::string> ListFiles(const std::filesystem::path &folder,
                                    std::string_view patterns = "*.*");
+// The names of the immediate subfolders of `folder`, in name order.
+std::vector<std::string> ListFolderNames(const std::filesystem::path &folder);
 // Full paths of the immediate subfolders of `folder`, in name order.
 std::vector<std::filesystem::path> ListFolders(const std::filesystem::path &folder);

@@ -5,9 +5,20 @@
 
 #include <algorithm>
 
-NameIndex::NameIndex(const std::filesystem::path &folder) {
-  for (std::string &name : ListFiles(folder))
-    byFolded_[FoldName(name)].push_back(std::move(name));
+NameIndex::NameIndex(const std::filesystem::path &folder, const std::vector<std::string> &wanted) {
+  for (const std::string &name : wanted)
+    byFolded_.try_emplace(FoldName(name));
+  ForEachFile(folder, [this](std::string &&name) {
+    const auto found = byFolded_.find(FoldName(name));
+    if (found != byFolded_.end())
+      found->second.push_back(std::move(name));
+  });
+  // Several files differing only in case are rare; in name order, the choice among them does not
+  // depend on the file system's order.
+  for (auto &[folded, names] : byFolded_)
+    if (names.size() > 1)
+      std::sort(names.begin(), names.end(),
+                [](const std::string &a, const std::string &b) { return NameLess(a, b); });
 }
 
 const std::vector<std::string> &NameIndex::Matches(std::string_view name) const {

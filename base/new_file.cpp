@@ -39,12 +39,18 @@ std::error_code WriteNewFile(const fs::path &path, const std::string &bytes) {
 }
 
 std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
-  std::error_code error;
-  if (fs::is_symlink(source, error))
+  std::error_code linkError;
+  if (fs::is_symlink(source, linkError))
     return std::make_error_code(std::errc::too_many_symbolic_link_levels);
-  if (!CopyFileW(source.c_str(), path.c_str(), TRUE))
-    return LastError();
-  return {};
+  if (CopyFileW(source.c_str(), path.c_str(), TRUE))
+    return {};
+  const std::error_code error = LastError();
+  // Any other failure came after the new file may have been made.
+  if (!AlreadyExists(error)) {
+    SetFileAttributesW(path.c_str(), FILE_ATTRIBUTE_NORMAL);
+    DeleteFileW(path.c_str());
+  }
+  return error;
 }
 #else
 static std::error_code LastError() { return std::error_code(errno, std::generic_category()); }
@@ -91,6 +97,8 @@ static bool CopyContent(int in, int out, off_t size) {
     if (sent <= 0)
       return sent == 0;
     size -= sent;
+    if (size == 0)
+      return true;
   }
   char buffer[1 << 16];
   for (;;) {
@@ -128,9 +136,20 @@ std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
   if (::close(out) != 0 && !error)
     error = LastError();
   ::close(in);
+  if (error)
+    ::unlink(path.c_str());
   return error;
 }
 #endif
+
+bool AlreadyExists(const std::error_code &error) {
+#ifdef _WIN32
+  if (error.category() == std::system_category() &&
+      (error.value() == ERROR_FILE_EXISTS || error.value() == ERROR_ALREADY_EXISTS))
+    return true;
+#endif
+  return error == std::errc::file_exists;
+}
 
 std::string ReasonOf(const std::error_code &error) {
   if (error == std::errc::no_space_on_device)

@@ -9,8 +9,11 @@
 // that fails.
 std::error_code WriteNewFile(const std::filesystem::path &path, const std::string &bytes);
 // Copies the file `source` into the new file `path`, created the same way; a source that is a link
-// is refused. Returns the error when that fails.
+// is refused. Returns the error when that fails; a file it created is then deleted again, so that
+// nothing half-written stays.
 std::error_code CopyToNewFile(const std::filesystem::path &source,
                               const std::filesystem::path &path);
+// Whether `error` says that an entry of that name is already there.
+bool AlreadyExists(const std::error_code &error);
 // The reason of `error` for a message: "the disk is full" when it is, else the system's words.
 std::string ReasonOf(const std::error_code &error);

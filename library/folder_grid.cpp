@@ -26,6 +26,8 @@ void FolderGrid::ColourRow(int row, std::uint32_t colour) {
   Row(row).nameColour = colour;
 }
 
+std::filesystem::path FolderGrid::PathOf(int row) const { return Child(library, Row(row).name); }
+
 void FolderGrid::ClearFolders() {
   rows.resize(1);
   currentRow = 0;

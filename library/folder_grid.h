@@ -18,9 +18,9 @@ inline int GridHeightTwips(int rowCount) {
   return kRowHeight * (rowCount < 20 ? rowCount : 20) + 72;
 }
 
-// One row of the folder grid: column 0 the path, column 1 the name, column 2 the mark.
+// One row of the folder grid: column 1 the name, column 2 the mark (column 0, the path, is
+// FolderGrid::PathOf).
 struct GridRow {
-  std::filesystem::path path;
   std::string name;
   std::string mark;
   std::uint32_t nameColour = 0; // 0 is the grid's default (white)
@@ -37,6 +37,7 @@ bool AllowsSeveralLoaded(char letter);
 // The folder grid `Unigrid`: row 0 is the header row, whose name cell carries the rule text.
 struct FolderGrid {
   std::vector<GridRow> rows{GridRow{}};
+  std::filesystem::path library; // the folder that holds the rows' folders
   int currentRow = 0;
   int currentCol = 1;
 
@@ -45,6 +46,9 @@ struct FolderGrid {
   const GridRow &Row(int row) const { return rows[static_cast<size_t>(row)]; }
   // Whether `row` is a folder row (not the header row, not past the end).
   bool IsFolderRow(int row) const { return row >= 1 && row < RowCount(); }
+  // The folder of `row`: made when asked, so that a library of thousands of folders costs one
+  // name per row.
+  std::filesystem::path PathOf(int row) const;
   // The first shown folder row from `from` on, going round past the end, whose name starts with
   // `prefix` in any letter case; 0 when there is none.
   int FindShownRow(int from, std::string_view prefix) const;

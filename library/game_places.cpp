@@ -40,8 +40,13 @@ const fs::path &GamePlaces::Folder(Place place) {
 
 NameIndex &GamePlaces::Index(Place place) {
   Entry &entry = At(place);
-  if (!entry.index)
-    entry.index.emplace(Folder(place));
+  if (!entry.index) {
+    std::vector<std::string> wanted;
+    for (const std::string &name : names_)
+      if (PlaceOf(name) == place)
+        wanted.push_back(name);
+    entry.index.emplace(Folder(place), wanted);
+  }
   return *entry.index;
 }
 

@@ -7,7 +7,9 @@
 #include <array>
 #include <filesystem>
 #include <optional>
+#include <string>
 #include <utility>
+#include <vector>
 
 // The folder of `place` in the game folder: the game folder itself, or its "Savedata" or
 // "Music" subfolder found whatever its letter case (the usual spelling when there is none).
@@ -19,10 +21,13 @@ bool EnsurePlaceFolder(const std::filesystem::path &folder, Failures &failures);
 // The game's three places during one load or unload: each found and listed at most once.
 class GamePlaces {
 public:
-  explicit GamePlaces(std::filesystem::path eawDir) : eawDir_(std::move(eawDir)) {}
+  // `names` are the file names the operation asks about (see Index).
+  explicit GamePlaces(std::filesystem::path eawDir, std::vector<std::string> names = {})
+      : eawDir_(std::move(eawDir)), names_(std::move(names)) {}
   // The place's folder, found on first use.
   const std::filesystem::path &Folder(Place place);
-  // The place's files, listed on first use.
+  // The place's files named in any case like one of the names given that go there (see PlaceOf),
+  // listed on first use.
   NameIndex &Index(Place place);
   // Creates the place's folder when missing; false, with the reason, when that fails.
   bool Ensure(Place place, Failures &failures);
@@ -36,5 +41,6 @@ private:
   Entry &At(Place place) { return entries_[static_cast<size_t>(place)]; }
 
   std::filesystem::path eawDir_;
+  std::vector<std::string> names_;
   std::array<Entry, kPlaceCount> entries_;
 };

@@ -3,7 +3,8 @@
 #include "base/names.h"
 #include "library/keeping.h"
 
-#include <map>
+#include <array>
+#include <iterator>
 
 namespace fs = std::filesystem;
 
@@ -14,24 +15,32 @@ bool IsReservedFolder(std::string_view name) {
 }
 
 void BuildFolderRows(FolderGrid &grid, const std::vector<std::string> &codes,
-                     const std::vector<fs::path> &libraryFolders) {
+                     const fs::path &library, std::vector<std::string> folderNames) {
   grid.ClearFolders();
+  grid.library = library;
   // Group the folders by first character once, so each category line costs only its own rows.
-  std::map<char, std::vector<GridRow>> byLetter;
-  for (const fs::path &folder : libraryFolders) {
-    std::string name = NameText(folder);
+  std::array<std::vector<GridRow>, 256> byLetter;
+  for (std::string &name : folderNames) {
     if (name.empty() || IsReservedFolder(name))
       continue;
     GridRow row;
-    row.path = folder;
     row.name = std::move(name);
-    byLetter[row.name[0]].push_back(std::move(row));
+    byLetter[static_cast<unsigned char>(row.name[0])].push_back(std::move(row));
   }
-  for (const std::string &code : codes) {
-    if (code.empty())
+  // A letter on two category lines shows its folders twice: only the last line takes the rows.
+  std::array<size_t, 256> lastLine{};
+  for (size_t line = 0; line < codes.size(); ++line)
+    if (!codes[line].empty())
+      lastLine[static_cast<unsigned char>(codes[line][0])] = line;
+  for (size_t line = 0; line < codes.size(); ++line) {
+    if (codes[line].empty())
       continue;
-    const auto found = byLetter.find(code[0]);
-    if (found != byLetter.end())
-      grid.rows.insert(grid.rows.end(), found->second.begin(), found->second.end());
+    const auto letter = static_cast<unsigned char>(codes[line][0]);
+    std::vector<GridRow> &rows = byLetter[letter];
+    if (line == lastLine[letter])
+      grid.rows.insert(grid.rows.end(), std::make_move_iterator(rows.begin()),
+                       std::make_move_iterator(rows.end()));
+    else
+      grid.rows.insert(grid.rows.end(), rows.begin(), rows.end());
   }
 }

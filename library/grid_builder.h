@@ -10,7 +10,8 @@
 // Whether a library folder name is reserved ("AUTOSCRIPTS", "SKINFOLDER", "UNUSED" and the
 // program's own keeping folder, any case).
 bool IsReservedFolder(std::string_view name);
-// Replaces the grid's folder rows: for each category letter in file order, every library folder
-// whose name starts with that letter, in name order. The header row stays.
+// Replaces the grid's folder rows: for each category letter in file order, every folder of
+// `folderNames` (the subfolders of `library`, in name order) whose name starts with that letter.
+// The header row stays.
 void BuildFolderRows(FolderGrid &grid, const std::vector<std::string> &codes,
-                     const std::vector<std::filesystem::path> &libraryFolders);
+                     const std::filesystem::path &library, std::vector<std::string> folderNames);

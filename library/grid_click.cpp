@@ -46,7 +46,7 @@ int LastLoaded(const FolderGrid &grid, char letter) {
 std::vector<std::string> Load(LibraryState &state, int row, Caption &caption, Failures &failures) {
   const size_t before = failures.Lines().size();
   const std::vector<std::string> overwritten =
-      MoveIn(state, state.Unigrid.Row(row).path, caption, failures);
+      MoveIn(state, state.Unigrid.PathOf(row), caption, failures);
   MarkLoaded(state, row);
   SaveLoaded(state, failures);
   if (!state.Ready)
@@ -65,7 +65,7 @@ std::vector<std::string> Load(LibraryState &state, int row, Caption &caption, Fa
 // the save files home into its folder.
 std::vector<std::string> ClickCampaign(LibraryState &state, int clicked, Caption &caption,
                                        Failures &failures) {
-  const fs::path folder = state.Unigrid.Row(clicked).path;
+  const fs::path folder = state.Unigrid.PathOf(clicked);
   if (IsLoaded(state.Unigrid.Row(clicked))) {
     MarkNotLoaded(state, clicked);
     MoveOut(state, folder, caption, failures);
@@ -75,7 +75,7 @@ std::vector<std::string> ClickCampaign(LibraryState &state, int clicked, Caption
   const int other = FirstLoaded(state.Unigrid, kCampaign);
   if (other != 0) {
     MarkNotLoaded(state, other);
-    MoveOut(state, state.Unigrid.Row(other).path, caption, failures);
+    MoveOut(state, state.Unigrid.PathOf(other), caption, failures);
   }
   return Load(state, clicked, caption, failures);
 }
@@ -107,11 +107,11 @@ std::vector<std::string> ClickOther(LibraryState &state, int clicked, Caption &c
       state.Slots.frameVisible = false;
     // Unmarked first, so that the record written by the unload no longer names it.
     MarkNotLoaded(state, other);
-    MoveOut(state, state.Unigrid.Row(other).path, caption, failures);
+    MoveOut(state, state.Unigrid.PathOf(other), caption, failures);
   }
   const std::vector<std::string> overwritten = Load(state, clicked, caption, failures);
   if (letter == kFlightModel)
-    ShowPlaneSets(state, state.Unigrid.Row(clicked).path, failures);
+    ShowPlaneSets(state, state.Unigrid.PathOf(clicked), failures);
   return overwritten;
 }
 
@@ -124,10 +124,11 @@ std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption
     return {};
   const GridRow &clicked = state.Unigrid.Row(row);
   if (state.Ready && !IsLoaded(clicked)) {
-    FolderCheck(clicked.path);
+    const fs::path folder = state.Unigrid.PathOf(row);
+    FolderCheck(folder);
     if (!FolderFound) {
-      failures.Add(clicked.path, "is no longer in the library, so nothing was loaded "
-                                 "(\"Refresh!\" shows the library as it is now)");
+      failures.Add(folder, "is no longer in the library, so nothing was loaded "
+                           "(\"Refresh!\" shows the library as it is now)");
       return {};
     }
   }

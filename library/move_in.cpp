@@ -22,12 +22,13 @@ struct Copy {
 // The copies a load makes, with the game's own files among their targets marked to be kept;
 // notes in `overwritten` the loaded folders whose files it replaces.
 std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
-                             const Ledger &ledger, GamePlaces &places,
-                             std::set<std::string> &overwritten, Failures &failures) {
+                             const std::vector<std::string> &files, const Ledger &ledger,
+                             GamePlaces &places, std::set<std::string> &overwritten,
+                             Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
   const auto providers = ledger.LastProviders();
   std::vector<Copy> copies;
-  for (const std::string &name : ListFiles(folder)) {
+  for (const std::string &name : files) {
     if (StaysInLibrary(name))
       continue;
     const Place place = PlaceOf(name);
@@ -60,9 +61,11 @@ std::vector<std::string> MoveIn(LibraryState &state, const fs::path &folder, Cap
   const fs::path keeping = KeepingFolder(state.LibDir);
   Ledger ledger = Ledger::Read(keeping, failures);
   const std::string name = NameText(folder);
-  GamePlaces places(state.EAWDir);
+  const std::vector<std::string> files = ListFiles(folder);
+  GamePlaces places(state.EAWDir, files);
   std::set<std::string> overwritten;
-  const std::vector<Copy> copies = PlanCopies(state, folder, ledger, places, overwritten, failures);
+  const std::vector<Copy> copies =
+      PlanCopies(state, folder, files, ledger, places, overwritten, failures);
   ledger.Remove(name);
   Journal journal{Journal::Step::Load, name, {}};
   for (const Copy &copy : copies)
@@ -82,9 +85,8 @@ std::vector<std::string> MoveIn(LibraryState &state, const fs::path &folder, Cap
     if (copy.entry.keepOriginal &&
         !MoveReplacing(destination, OriginalPath(keeping, target), failures))
       continue;
-    if (!CopyReplacing(copy.source, destination, failures))
+    if (!CopyJournaled(copy.source, destination, failures))
       continue;
-    places.Index(target.place).Add(target.name);
     loaded.files.push_back(target);
     ++state.tally.copied;
     caption.Set("Please wait- copying: :" + NameText(copy.source));

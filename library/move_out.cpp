@@ -16,8 +16,9 @@ namespace fs = std::filesystem;
 // one game file has the name in any case.
 static std::vector<Journal::Entry> ListedCopies(const fs::path &eawDir, const fs::path &folder) {
   std::vector<Journal::Entry> entries;
-  GamePlaces places(eawDir);
-  for (const std::string &name : ListFiles(folder)) {
+  const std::vector<std::string> names = ListFiles(folder);
+  GamePlaces places(eawDir, names);
+  for (const std::string &name : names) {
     if (StaysInLibrary(name) || IsSaveFile(name))
       continue;
     const Place place = PlaceOf(name);
@@ -63,6 +64,6 @@ void Udel(LibraryState &state, int row, Caption &caption, Failures &failures) {
     return;
   grid.Row(row).mark.clear();
   grid.ColourRow(row, state.GridBackColor);
-  const fs::path folder = grid.Row(row).path;
+  const fs::path folder = grid.PathOf(row);
   MoveOut(state, folder, caption, failures);
 }

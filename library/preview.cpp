@@ -33,5 +33,5 @@ FolderPreview PreviewOf(const fs::path &folder) {
 FolderPreview PreviewOfRow(const LibraryState &state, int row) {
   if (row < 1 || row >= state.Unigrid.RowCount())
     return {};
-  return PreviewOf(state.Unigrid.rows[static_cast<size_t>(row)].path);
+  return PreviewOf(state.Unigrid.PathOf(row));
 }

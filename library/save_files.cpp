@@ -18,9 +18,9 @@ bool IsCampaignFolder(const fs::path &folder) {
 void CarrySaveFiles(const fs::path &eawDir, const fs::path &campaign, Caption &caption,
                     Failures &failures) {
   const fs::path savedata = PlaceFolder(eawDir, Place::Savedata);
-  NameIndex campaignFiles(campaign);
   // One listing: each file is tried once, so a file that cannot be moved ends the work.
   const std::vector<std::string> saves = ListFiles(savedata, "*.sve");
+  NameIndex campaignFiles(campaign, saves);
   int done = 0;
   for (const std::string &name : saves) {
     caption.Progress(++done, static_cast<int>(saves.size()));

@@ -2,7 +2,7 @@
 # Installs the Debian packages the build, the tests (Linux and Windows under Wine) and the demo
 # need; does nothing when all are there.
 set -euo pipefail
-packages=(cmake g++ make qt6-base-dev libgtest-dev libbenchmark-dev xvfb xauth fonts-liberation2
+packages=(cmake g++ make qt6-base-dev libgtest-dev xvfb xauth fonts-liberation2
   g++-mingw-w64-x86-64-posix wine64)
 missing=()
 for p in "${packages[@]}"; do

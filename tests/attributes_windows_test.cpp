@@ -54,13 +54,14 @@ TEST_F(WindowsFiles, ReadOnlyHiddenAndSystemFilesAreReplacedAndDeleted) {
   game.Write("planes.dat", "the game's");
   Give(InGame("planes.dat"),
        FILE_ATTRIBUTE_READONLY | FILE_ATTRIBUTE_HIDDEN | FILE_ATTRIBUTE_SYSTEM);
-  // A read-only temporary copy left by an interrupted load must not block this one.
-  game.Write("one.dat.partial", "half");
-  Give(InGame("one.dat.partial"), FILE_ATTRIBUTE_READONLY);
   Give(game.Library() / "S-One" / "two.dat", FILE_ATTRIBUTE_READONLY);
   Load("S-One");
   EXPECT_EQ(game.Read("planes.dat"), "planes.dat");
   EXPECT_EQ(game.Read("one.dat"), "one.dat");
+  // A read-only temporary copy left by an interrupted copy must not block the next one.
+  game.Write("one.dat.partial", "half");
+  Give(InGame("one.dat.partial"), FILE_ATTRIBUTE_READONLY);
+  EXPECT_TRUE(CopyReplacing(game.Library() / "S-One" / "one.dat", InGame("one.dat"), failures));
   EXPECT_FALSE(game.Exists("one.dat.partial"));
   EXPECT_FALSE(Has(InGame("planes.dat"), FILE_ATTRIBUTE_READONLY | FILE_ATTRIBUTE_HIDDEN));
   EXPECT_FALSE(Has(InGame("two.dat"), FILE_ATTRIBUTE_READONLY));

@@ -33,7 +33,7 @@ TEST(LibraryModel, GridFollowsCategoryLinesThenNames) {
   const SelectorState state = PreparedState(game, failures);
   EXPECT_EQ(RowNames(state.Unigrid), (Lines{"S a", "S-b", "SkinFolder2", "Sunset", "C-camp", "S a",
                                             "S-b", "SkinFolder2", "Sunset", "s-low"}));
-  EXPECT_EQ(state.Unigrid.rows[5].path, game.Path() / "ZEP128" / "C-camp");
+  EXPECT_EQ(state.Unigrid.PathOf(5), game.Path() / "ZEP128" / "C-camp");
   EXPECT_EQ(state.Unigrid.rows[5].mark, "");
 }
 

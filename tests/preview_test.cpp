@@ -34,11 +34,9 @@ TEST(Preview, DescriptionAndFirstPictureInNameOrder) {
 TEST(Preview, HeaderRowRemovedFolderAndUnreadableDescriptionGiveAnEmptyPreview) {
   TestFolder lib;
   LibraryState state;
-  for (const char *name : {"S-Gone", "S-Locked"}) {
-    GridRow folderRow;
-    folderRow.path = lib.Path() / name;
-    state.Unigrid.rows.push_back(folderRow);
-  }
+  state.Unigrid.library = lib.Path();
+  for (const char *name : {"S-Gone", "S-Locked"})
+    state.Unigrid.rows.push_back(GridRow{name, "", 0, kRowHeight});
   lib.MakeFolder("S-Locked/contents.txt/not-a-file");
   for (int row : {-1, 0, 1, 2, 3}) {
     const FolderPreview preview = PreviewOfRow(state, row);

@@ -38,7 +38,7 @@ TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
   game.Write(pack + "p-lower/c.zep", "x");
   game.Write(pack + "Sounds/P-Inner/d.zep", "x");
   game.Write("ZEP128/F-Plain/planes.dat");
-  BuildFolderRows(state.Unigrid, {"F"}, ListFolders(state.LibDir));
+  BuildFolderRows(state.Unigrid, {"F"}, state.LibDir, ListFolderNames(state.LibDir));
   RecordingCaption caption;
   Failures failures;
 

@@ -33,6 +33,24 @@ TEST(TextFile, AtomicWriteReplacesWholeOrLeavesTheOldFile) {
   EXPECT_NE(failures.Lines()[0].find("record.txt"), std::string::npos);
 }
 
+TEST(Copy, OnlyANewNameIsWrittenWithoutTheTemporaryFile) {
+  TestFolder folder;
+  const fs::path source = folder.Write("source.dat", "new");
+  // A folder holding a temporary name blocks every copy that needs it.
+  for (const char *name : {"free.dat", "kept.dat", "listed.dat"})
+    folder.MakeFolder(std::string(name) + ".partial/in the way");
+  folder.Write("kept.dat", "old");
+  folder.Write("listed.dat", "old");
+  Failures failures;
+  EXPECT_TRUE(CopyJournaled(source, folder.Path() / "free.dat", failures));
+  EXPECT_FALSE(CopyReplacing(source, folder.Path() / "kept.dat", failures));
+  EXPECT_FALSE(CopyJournaled(source, folder.Path() / "listed.dat", failures));
+  EXPECT_EQ(folder.Read("free.dat"), "new");
+  EXPECT_EQ(folder.Read("kept.dat"), "old");
+  EXPECT_EQ(folder.Read("listed.dat"), "old");
+  EXPECT_EQ(failures.Lines().size(), 2u);
+}
+
 TEST(Existence, FilesAndFoldersAreToldApart) {
   TestFolder folder;
   const fs::path file = folder.Write("eaw.ini");

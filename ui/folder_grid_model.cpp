@@ -23,7 +23,7 @@ QVariant FolderGridModel::data(const QModelIndex &index, int role) const {
   if (role == Qt::DisplayRole) {
     switch (index.column()) {
     case 0:
-      return FromPath(row.path);
+      return FromPath(grid_.PathOf(index.row() + 1));
     case 1:
       return FromName(row.name);
     default:
