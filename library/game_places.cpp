@@ -50,6 +50,13 @@ NameIndex &GamePlaces::Index(Place place) {
   return *entry.index;
 }
 
+FileRemover &GamePlaces::Remover(Place place) {
+  Entry &entry = At(place);
+  if (!entry.remover)
+    entry.remover.emplace(Folder(place));
+  return *entry.remover;
+}
+
 bool GamePlaces::Ensure(Place place, Failures &failures) {
   Entry &entry = At(place);
   if (!entry.usable)

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "base/failures.h"
+#include "base/file_remover.h"
 #include "base/name_index.h"
 #include "library/file_rules.h"
 
@@ -29,6 +30,8 @@ public:
   // The place's files named in any case like one of the names given that go there (see PlaceOf),
   // listed on first use.
   NameIndex &Index(Place place);
+  // Deletes files of the place's folder by name, which it opens on first use.
+  FileRemover &Remover(Place place);
   // Creates the place's folder when missing; false, with the reason, when that fails.
   bool Ensure(Place place, Failures &failures);
 
@@ -36,6 +39,7 @@ private:
   struct Entry {
     std::optional<std::filesystem::path> folder;
     std::optional<NameIndex> index;
+    std::optional<FileRemover> remover;
     std::optional<bool> usable;
   };
   Entry &At(Place place) { return entries_[static_cast<size_t>(place)]; }

@@ -2,6 +2,7 @@
 
 #include "base/existence.h"
 #include "base/file_ops.h"
+#include "base/file_remover.h"
 #include "base/listing.h"
 #include "base/names.h"
 #include "base/text_file.h"
@@ -41,23 +42,18 @@ std::vector<std::string> CleanUpNames(const LibraryState &state, Failures &failu
 
 int DeleteFiles(const fs::path &folder, const std::vector<std::string> &names, Caption &caption,
                 Failures &failures) {
+  FileRemover remover(folder);
   int deleted = 0;
   for (size_t done = 0; done < names.size(); ++done) {
     caption.Progress(static_cast<int>(done + 1), static_cast<int>(names.size()));
-    deleted += RemoveFile(Child(folder, names[done]), failures) ? 1 : 0;
+    deleted += remover.Remove(names[done], failures) ? 1 : 0;
   }
   return deleted;
 }
 
 void CleanUp(LibraryState &state, const std::vector<std::string> &names, Caption &caption,
              Failures &failures) {
-  std::vector<std::string> present;
-  for (const std::string &name : names) {
-    FileCheck(Child(state.EAWDir, name));
-    if (FileFound)
-      present.push_back(name);
-  }
-  state.tally.removed += DeleteFiles(state.EAWDir, present, caption, failures);
+  state.tally.removed += DeleteFiles(state.EAWDir, names, caption, failures);
 }
 
 void RestoreOriginals(LibraryState &state, Failures &failures) {

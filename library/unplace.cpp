@@ -31,9 +31,9 @@ void UnplaceFiles(LibraryState &state, const Ledger &ledger,
     const PlacedFile &file = entry.file;
     if (IsSaveFile(file.name))
       continue;
-    const fs::path target = Child(places.Folder(file.place), file.name);
+    const fs::path &folder = places.Folder(file.place);
     if (afterCrash)
-      RemovePartial(PartialPath(target));
+      RemovePartial(PartialPath(Child(folder, file.name)));
     const std::string key = PlaceKey(file.place, file.name);
     const bool originalKept = kept.count(key) > 0;
     if (entry.keepOriginal && !originalKept)
@@ -41,15 +41,15 @@ void UnplaceFiles(LibraryState &state, const Ledger &ledger,
     const auto provider = providers.find(key);
     if (provider != providers.end()) {
       caption.Set("Please wait- copying: :" + file.name);
-      if (CopyReplacing(FindAnyCase(Child(state.LibDir, provider->second), file.name), target,
-                        failures))
+      if (CopyReplacing(FindAnyCase(Child(state.LibDir, provider->second), file.name),
+                        Child(folder, file.name), failures))
         ++state.tally.restored;
     } else if (originalKept) {
-      if (MoveReplacing(OriginalPath(keeping, file), target, failures))
+      if (MoveReplacing(OriginalPath(keeping, file), Child(folder, file.name), failures))
         ++state.tally.restored;
     } else {
       caption.Set("Deleting " + file.name);
-      if (RemoveFile(target, failures))
+      if (places.Remover(file.place).Remove(file.name, failures))
         ++state.tally.removed;
     }
   }
