@@ -7,6 +7,7 @@
 #include <QApplication>
 #include <algorithm>
 #include <cstdio>
+#include <fcntl.h>
 #include <fstream>
 #include <memory>
 #include <spawn.h>
@@ -58,8 +59,14 @@ double RunChild(const BenchGame &game) {
   const std::string folder = game.game.string();
   char *args[] = {const_cast<char *>(self.c_str()), const_cast<char *>("--show-window"),
                   const_cast<char *>(folder.c_str()), nullptr};
+  // Qt's notes on the missing runtime folder of a headless machine would fill the table.
+  posix_spawn_file_actions_t quiet;
+  posix_spawn_file_actions_init(&quiet);
+  posix_spawn_file_actions_addopen(&quiet, STDERR_FILENO, "/dev/null", O_WRONLY, 0);
   pid_t child = 0;
-  if (posix_spawn(&child, self.c_str(), nullptr, nullptr, args, environ) != 0)
+  const int spawned = posix_spawn(&child, self.c_str(), &quiet, nullptr, args, environ);
+  posix_spawn_file_actions_destroy(&quiet);
+  if (spawned != 0)
     return 0;
   int status = 0;
   rusage usage{};

@@ -84,8 +84,10 @@ TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
   Click("N-B");
   const std::vector<std::string> names = selector->ResetAllFiles(failures);
   EXPECT_EQ(names, (std::vector<std::string>{"bases.dat", "sky.spt"}));
+  // Gone while the player was asked: neither a failure nor a deletion.
+  fs::remove(game.Path() / "sky.spt");
   selector->ResetAll(names, failures);
-  EXPECT_EQ(selector->State().summary, "Reset All: 2 files deleted, 2 put back.");
+  EXPECT_EQ(selector->State().summary, "Reset All: 1 file deleted, 2 put back.");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
   EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
   EXPECT_FALSE(game.Exists("sky.spt"));
