@@ -13,6 +13,16 @@ public:
   virtual void Progress(int /*done*/, int /*total*/) {}
 };
 
+// A caption with no window to show it: keeps its text only, for the core run headless.
+class StoredCaption : public Caption {
+public:
+  std::string Get() const override { return text_; }
+  void Set(const std::string &text) override { text_ = text; }
+
+private:
+  std::string text_;
+};
+
 // Restores the caption it found when it goes out of scope.
 class CaptionRestorer {
 public:

@@ -13,16 +13,20 @@
 
 namespace fs = std::filesystem;
 
+// Deletes by full path: where the folder could not be opened, and on Windows, which has no
+// deletion relative to an open folder that a program may call.
+static bool RemoveByPath(const fs::path &path, Failures &failures) {
+  std::error_code error;
+  return fs::exists(fs::symlink_status(path, error)) && RemoveFile(path, failures);
+}
+
 #ifdef _WIN32
-// Windows has no deletion relative to an open folder that a program may call.
 FileRemover::FileRemover(fs::path folder) : folder_(std::move(folder)) {}
 
 FileRemover::~FileRemover() = default;
 
 bool FileRemover::Remove(const std::string &name, Failures &failures) {
-  const fs::path path = Child(folder_, name);
-  std::error_code error;
-  return fs::exists(path, error) && RemoveFile(path, failures);
+  return RemoveByPath(Child(folder_, name), failures);
 }
 #else
 FileRemover::FileRemover(fs::path folder)
@@ -35,11 +39,8 @@ FileRemover::~FileRemover() {
 }
 
 bool FileRemover::Remove(const std::string &name, Failures &failures) {
-  if (descriptor_ < 0) {
-    const fs::path path = Child(folder_, name);
-    std::error_code error;
-    return fs::exists(path, error) && RemoveFile(path, failures);
-  }
+  if (descriptor_ < 0)
+    return RemoveByPath(Child(folder_, name), failures);
   if (::unlinkat(descriptor_, name.c_str(), 0) == 0)
     return true;
   if (errno == ENOENT)

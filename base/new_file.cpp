@@ -42,10 +42,12 @@ std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
   std::error_code linkError;
   if (fs::is_symlink(source, linkError))
     return std::make_error_code(std::errc::too_many_symbolic_link_levels);
+  // Asked first, so that what a failed copy leaves behind is surely its own to delete.
+  if (GetFileAttributesW(path.c_str()) != INVALID_FILE_ATTRIBUTES)
+    return std::error_code(ERROR_FILE_EXISTS, std::system_category());
   if (CopyFileW(source.c_str(), path.c_str(), TRUE))
     return {};
   const std::error_code error = LastError();
-  // Any other failure came after the new file may have been made.
   if (!AlreadyExists(error)) {
     SetFileAttributesW(path.c_str(), FILE_ATTRIBUTE_NORMAL);
     DeleteFileW(path.c_str());

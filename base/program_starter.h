@@ -12,3 +12,9 @@ public:
   // not be started.
   virtual bool StartDetached(const std::filesystem::path &program, bool windowsProgram) = 0;
 };
+
+// A starter for the core run headless, where no game is ever started: starts nothing.
+class NoProgramStarter : public ProgramStarter {
+public:
+  bool StartDetached(const std::filesystem::path &, bool) override { return false; }
+};

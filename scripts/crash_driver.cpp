@@ -23,20 +23,6 @@ namespace fs = std::filesystem;
 
 namespace {
 
-class SilentCaption : public Caption {
-public:
-  std::string Get() const override { return text_; }
-  void Set(const std::string &text) override { text_ = text; }
-
-private:
-  std::string text_;
-};
-
-class NoStarter : public ProgramStarter {
-public:
-  bool StartDetached(const fs::path &, bool) override { return false; }
-};
-
 // FNV-1a of the file's bytes; "missing" when it cannot be read.
 std::string Checksum(const fs::path &file) {
   Failures ignored;
@@ -131,8 +117,8 @@ int main(int argc, char **argv) {
     return WriteManifest(game, name);
   if (step == "check")
     return Check(game, name);
-  SilentCaption caption;
-  NoStarter starter;
+  StoredCaption caption;
+  NoProgramStarter starter;
   Selector selector(game, caption, starter);
   Failures failures;
   selector.StartUp(failures);

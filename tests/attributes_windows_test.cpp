@@ -108,6 +108,19 @@ TEST_F(WindowsFiles, ReadOnlyRecordAndSettingsAreReplacedKeepingHiddenAndSystem)
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
+TEST_F(WindowsFiles, ASourceHeldOpenLeavesTheFilesItWouldReplaceAsTheyWere) {
+  game.Write("source.dat", "new");
+  game.Write("target.dat", "old");
+  HeldOpen held(InGame("source.dat"));
+  ASSERT_TRUE(held.Held());
+  EXPECT_FALSE(CopyJournaled(InGame("source.dat"), InGame("target.dat"), failures));
+  EXPECT_FALSE(CopyJournaled(InGame("source.dat"), InGame("free.dat"), failures));
+  EXPECT_EQ(game.Read("target.dat"), "old");
+  EXPECT_FALSE(game.Exists("free.dat"));
+  EXPECT_FALSE(game.Exists("target.dat.partial"));
+  EXPECT_EQ(failures.Lines().size(), 2u);
+}
+
 TEST_F(WindowsFiles, AFileHeldOpenIsSkippedNamedAndLeftAsItWas) {
   game.Addon("S-Held", {"held.dat", "free.dat"});
   game.Write("held.dat", "the game's");
