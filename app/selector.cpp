@@ -28,7 +28,7 @@ void Selector::StartUp(Failures &failures) {
   RemovePartial(PartialPath(CategoryPath(state_.LibDir)));
   state_.Ready = false;
   const std::vector<SkippedLine> skipped = PrepareLibrary(state_, failures);
-  BuildGrid(state_, failures);
+  BuildGrid(state_, state_.Codes);
   EnsureRecord(state_, failures);
   ReplayRecord(state_, caption_, failures);
   state_.BackPic = GamePicture(state_.EAWDir, "background");
@@ -93,7 +93,7 @@ void Selector::RefreshLibrary(Failures &failures) {
   state_.Ready = false;
   // Start-up writes both files when missing; a rebuild needs them just the same.
   EnsureCategoryFile(state_.LibDir, failures);
-  BuildGrid(state_, failures);
+  BuildGrid(state_, LibraryCategories(state_.LibDir, failures).codes);
   EnsureRecord(state_, failures);
   ReplayRecord(state_, caption_, failures);
   // The rows under the pointer are other folders now, so the next move rebuilds the preview.

@@ -26,9 +26,8 @@ std::vector<SkippedLine> PrepareLibrary(SelectorState &state, Failures &failures
   return std::move(categories.skipped);
 }
 
-void BuildGrid(LibraryState &state, Failures &failures) {
-  const Categories categories = LibraryCategories(state.LibDir, failures);
-  BuildFolderRows(state.Unigrid, categories.codes, state.LibDir, ListFolderNames(state.LibDir));
+void BuildGrid(LibraryState &state, const std::vector<std::string> &codes) {
+  BuildFolderRows(state.Unigrid, codes, state.LibDir, ListFolderNames(state.LibDir));
 }
 
 fs::path GamePicture(const fs::path &eawDir, const char *name) {

@@ -17,7 +17,7 @@ SelectorState PreparedState(const GameFolder &game, Failures &failures) {
   SelectorState state;
   static_cast<LibraryState &>(state) = LibraryFor(game.Path());
   PrepareLibrary(state, failures);
-  BuildGrid(state, failures);
+  BuildGrid(state, state.Codes);
   return state;
 }
 

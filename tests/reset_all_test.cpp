@@ -35,7 +35,7 @@ protected:
 
 TEST_F(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
   state.GridBackColor = 0xFFFFFF;
-  BuildGrid(state, failures);
+  BuildGrid(state, LibraryCategories(state.LibDir, failures).codes);
   ReplayRecord(state, caption, failures);
   ASSERT_EQ(state.Unigrid.rows[1].mark, "S");
   state.Slots.frameVisible = true;
