@@ -1,0 +1,54 @@
+#include "base/plain_name.h"
+
+#include "base/names.h"
+
+#include <algorithm>
+#include <array>
+
+namespace {
+
+// Windows opens a device for these names whatever their extension ("nul.txt" is NUL).
+bool IsDeviceName(std::string_view name) {
+  static constexpr std::array<std::string_view, 6> kDevices = {"CON", "PRN",    "AUX",
+                                                               "NUL", "CONIN$", "CONOUT$"};
+  const std::string stem = Upper(name.substr(0, name.find('.')));
+  // Trailing blanks before the extension are dropped by Windows too ("nul .txt").
+  const std::string_view trimmed(stem.data(), stem.find_last_not_of(' ') + 1);
+  if (std::find(kDevices.begin(), kDevices.end(), trimmed) != kDevices.end()) {
+    return true;
+  }
+  const bool numbered =
+      trimmed.size() == 4 && (trimmed.starts_with("COM") || trimmed.starts_with("LPT"));
+  return numbered && trimmed[3] >= '1' && trimmed[3] <= '9';
+}
+
+bool HasForbiddenByte(std::string_view name) {
+  return std::any_of(name.begin(), name.end(), [](char c) {
+    const auto byte = static_cast<unsigned char>(c);
+    return byte < 0x20 || c == '/' || c == '\\' || c == ':';
+  });
+}
+
+} // namespace
+
+std::string PlainNameProblem(std::string_view name) {
+  if (name.empty()) {
+    return "an empty name";
+  }
+  if (name == "." || name == "..") {
+    return "not a name but a step between folders";
+  }
+  if (name.size() > 255) {
+    return "a name longer than 255 bytes";
+  }
+  if (HasForbiddenByte(name)) {
+    return "a path, not a plain name (it holds a separator, a drive or a control character)";
+  }
+  if (name.back() == '.' || name.back() == ' ') {
+    return "a name Windows cannot keep (it ends in a dot or blank)";
+  }
+  if (IsDeviceName(name)) {
+    return "a name Windows reserves for a device";
+  }
+  return {};
+}
