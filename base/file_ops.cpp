@@ -1,5 +1,6 @@
 #include "base/file_ops.h"
 
+#include "base/links.h"
 #include "base/names.h"
 #include "base/new_file.h"
 #include "base/text_file.h"
@@ -20,7 +21,8 @@ namespace fs = std::filesystem;
 static bool IsNormal(const fs::path &) { return false; }
 
 bool MakeNormal(const fs::path &path, Failures &failures) {
-  if (SetFileAttributesW(path.c_str(), FILE_ATTRIBUTE_NORMAL))
+  // A link is replaced or deleted as it is; its attributes would be those of what it points at.
+  if (IsLink(path) || SetFileAttributesW(path.c_str(), FILE_ATTRIBUTE_NORMAL))
     return true;
   failures.Add(path, "cannot be made writable (" +
                          std::system_category().message(static_cast<int>(GetLastError())) + ")");
@@ -32,10 +34,16 @@ static bool IsNormal(const fs::path &path) {
   return (fs::status(path, error).permissions() & fs::perms::owner_write) != fs::perms::none;
 }
 
-bool MakeNormal(const fs::path &path, Failures &failures) { return MakeWritable(path, failures); }
+bool MakeNormal(const fs::path &path, Failures &failures) {
+  return IsLink(path) || MakeWritable(path, failures);
+}
 #endif
 
 bool MakeWritable(const fs::path &path, Failures &failures) {
+  // A link is renamed over or deleted without write access, and changing it would change its
+  // target.
+  if (IsLink(path))
+    return true;
   std::error_code error;
   const fs::perms perms = fs::status(path, error).permissions();
   if (!error && (perms & fs::perms::owner_write) != fs::perms::none)
@@ -67,12 +75,13 @@ fs::path PartialPath(const fs::path &target) {
 void RemovePartial(const fs::path &partial) {
   std::error_code error;
   // A link of that name is removed itself, never what it points to.
-  const fs::file_status status = fs::symlink_status(partial, error);
-  if (!fs::is_regular_file(status) && !fs::is_symlink(status))
+  const bool link = IsLink(partial);
+  if (!link && !fs::is_regular_file(fs::symlink_status(partial, error)))
     return;
 #ifdef _WIN32
   // A copy of a read-only file left by a crash is read-only too, and Windows keeps it otherwise.
-  SetFileAttributesW(partial.c_str(), FILE_ATTRIBUTE_NORMAL);
+  if (!link)
+    SetFileAttributesW(partial.c_str(), FILE_ATTRIBUTE_NORMAL);
 #endif
   fs::remove(partial, error);
 }
@@ -87,9 +96,8 @@ static std::optional<fs::perms> PermissionsOf(const fs::path &path) {
 
 bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures &failures) {
   std::error_code error;
-  if (fs::is_symlink(target, error)) {
-    failures.Add(target, "is a link; the program does not write through links, so that nothing "
-                         "outside the game folder changes");
+  if (IsLink(target)) {
+    failures.Add(target, kLinkReason);
     return false;
   }
   const fs::path temporary = PartialPath(target);
@@ -148,8 +156,9 @@ static bool CopyOver(const fs::path &source, const fs::path &target, Failures &f
     return false;
   }
 #ifdef _WIN32
-  // Windows refuses to replace a read-only file.
-  SetFileAttributesW(target.c_str(), FILE_ATTRIBUTE_NORMAL);
+  // Windows refuses to replace a read-only file; a link is replaced as it is.
+  if (!IsLink(target))
+    SetFileAttributesW(target.c_str(), FILE_ATTRIBUTE_NORMAL);
 #endif
   fs::rename(temporary, target, error);
   if (error) {
@@ -193,7 +202,8 @@ bool CopyJournaled(const fs::path &source, const fs::path &target, Failures &fai
 // put back if the deletion fails anyway.
 static DWORD AllowDeletion(const fs::path &path) {
   const DWORD attributes = GetFileAttributesW(path.c_str());
-  if (attributes == INVALID_FILE_ATTRIBUTES || !(attributes & FILE_ATTRIBUTE_READONLY))
+  if (attributes == INVALID_FILE_ATTRIBUTES || !(attributes & FILE_ATTRIBUTE_READONLY) ||
+      (attributes & FILE_ATTRIBUTE_REPARSE_POINT))
     return INVALID_FILE_ATTRIBUTES;
   SetFileAttributesW(path.c_str(), attributes & ~DWORD{FILE_ATTRIBUTE_READONLY});
   return attributes;

@@ -1,6 +1,7 @@
 #include "base/file_remover.h"
 
 #include "base/file_ops.h"
+#include "base/links.h"
 #include "base/names.h"
 
 #include <cerrno>
@@ -17,7 +18,8 @@ namespace fs = std::filesystem;
 // deletion relative to an open folder that a program may call.
 static bool RemoveByPath(const fs::path &path, Failures &failures) {
   std::error_code error;
-  return fs::exists(fs::symlink_status(path, error)) && RemoveFile(path, failures);
+  return (IsLink(path) || fs::exists(fs::symlink_status(path, error))) &&
+         RemoveFile(path, failures);
 }
 
 #ifdef _WIN32

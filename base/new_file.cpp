@@ -1,5 +1,7 @@
 #include "base/new_file.h"
 
+#include "base/links.h"
+
 #ifdef _WIN32
 #include <algorithm>
 
@@ -38,18 +40,28 @@ std::error_code WriteNewFile(const fs::path &path, const std::string &bytes) {
   return error;
 }
 
+static std::error_code LinkError() {
+  return std::make_error_code(std::errc::too_many_symbolic_link_levels);
+}
+
 std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
-  std::error_code linkError;
-  if (fs::is_symlink(source, linkError))
-    return std::make_error_code(std::errc::too_many_symbolic_link_levels);
+  if (IsLink(source))
+    return LinkError();
   // Asked first, so that what a failed copy leaves behind is surely its own to delete.
   if (GetFileAttributesW(path.c_str()) != INVALID_FILE_ATTRIBUTES)
     return std::error_code(ERROR_FILE_EXISTS, std::system_category());
-  if (CopyFileW(source.c_str(), path.c_str(), TRUE))
-    return {};
-  const std::error_code error = LastError();
-  if (!AlreadyExists(error)) {
-    SetFileAttributesW(path.c_str(), FILE_ATTRIBUTE_NORMAL);
+  // A source that became a link since is copied as the link, never as what it points at, and the
+  // copy is then deleted again.
+  const DWORD flags = COPY_FILE_FAIL_IF_EXISTS | COPY_FILE_COPY_SYMLINK;
+  std::error_code error;
+  if (!CopyFileExW(source.c_str(), path.c_str(), nullptr, nullptr, nullptr, flags))
+    error = LastError();
+  else if (IsLink(path))
+    error = LinkError();
+  if (error && !AlreadyExists(error)) {
+    // A link is deleted as it is; its attributes would be those of what it points at.
+    if (!IsLink(path))
+      SetFileAttributesW(path.c_str(), FILE_ATTRIBUTE_NORMAL);
     DeleteFileW(path.c_str());
   }
   return error;

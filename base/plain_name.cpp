@@ -52,3 +52,25 @@ std::string PlainNameProblem(std::string_view name) {
   }
   return {};
 }
+
+// A name for a message: control bytes shown as "?", and a long one cut short.
+static std::string Shown(std::string_view name) {
+  std::string shown(name.substr(0, 80));
+  std::replace_if(
+      shown.begin(), shown.end(), [](char c) { return static_cast<unsigned char>(c) < 0x20; }, '?');
+  return name.size() > shown.size() ? shown + "..." : shown;
+}
+
+void RefuseLine(const std::filesystem::path &file, size_t line, std::string_view name,
+                const std::string &problem, Failures &failures) {
+  failures.Add(file, "line " + std::to_string(line) + " was ignored: \"" + Shown(name) + "\" is " +
+                         problem + ", so nothing was done for it");
+}
+
+bool AcceptPlainName(std::string_view name, const std::filesystem::path &file, size_t line,
+                     Failures &failures) {
+  const std::string problem = PlainNameProblem(name);
+  if (!problem.empty())
+    RefuseLine(file, line, name, problem, failures);
+  return problem.empty();
+}

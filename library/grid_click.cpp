@@ -2,6 +2,7 @@
 
 #include "base/existence.h"
 #include "library/keeping.h"
+#include "library/kept_links.h"
 #include "library/loaded_record.h"
 #include "library/move_in.h"
 #include "library/move_out.h"
@@ -131,6 +132,11 @@ std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption
                            "(\"Refresh!\" shows the library as it is now)");
       return {};
     }
+    // Loading makes the folder's files writable: never those of a folder elsewhere.
+    if (RefusedForLink(state, folder, "nothing was loaded", failures))
+      return {};
+  } else if (state.Ready && RefusedForLink(state, {}, "nothing was unloaded", failures)) {
+    return {};
   }
   if (Letter(clicked) == kCampaign)
     return ClickCampaign(state, row, caption, failures);

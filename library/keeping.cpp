@@ -2,6 +2,7 @@
 
 #include "base/file_ops.h"
 #include "base/names.h"
+#include "base/plain_name.h"
 #include "base/text_file.h"
 
 #include <algorithm>
@@ -69,12 +70,17 @@ Ledger Ledger::Read(const fs::path &keeping, Failures &failures) {
       ReadLinesIfExists(keeping / kLedgerFile, failures, Encoding::Bytes, kMaxKeepingBytes);
   if (!lines)
     return ledger;
-  for (const std::string &line : *lines) {
+  // The lines of a refused folder belong to no folder.
+  bool inFolder = false;
+  for (size_t at = 0; at < lines->size(); ++at) {
+    const std::string &line = (*lines)[at];
     if (const std::optional<PlacedFile> file = ParseFileLine(line)) {
-      if (!ledger.folders_.empty())
+      if (inFolder && AcceptPlainName(file->name, keeping / kLedgerFile, at + 1, failures))
         ledger.folders_.back().files.push_back(*file);
     } else if (Storable(line)) {
-      ledger.folders_.push_back({line, {}});
+      inFolder = AcceptPlainName(line, keeping / kLedgerFile, at + 1, failures);
+      if (inFolder)
+        ledger.folders_.push_back({line, {}});
     }
   }
   return ledger;
@@ -127,10 +133,14 @@ std::optional<Journal> Journal::Read(const fs::path &keeping, Failures &failures
   if (step == std::end(kSteps))
     return std::nullopt;
   journal.step = static_cast<Step>(step - std::begin(kSteps));
-  journal.folder = (*lines)[1];
+  const fs::path path = keeping / kJournalFile;
+  // Reset All names no folder; a refused one leaves the journal's files to be dealt with alone.
+  if (!(*lines)[1].empty() && AcceptPlainName((*lines)[1], path, 2, failures))
+    journal.folder = (*lines)[1];
   for (size_t i = 2; i < lines->size(); ++i)
     if (const std::optional<PlacedFile> file = ParseFileLine((*lines)[i]))
-      journal.entries.push_back({*file, (*lines)[i][2] == '+'});
+      if (AcceptPlainName(file->name, path, i + 1, failures))
+        journal.entries.push_back({*file, (*lines)[i][2] == '+'});
   return journal;
 }
 
@@ -142,6 +152,11 @@ bool Journal::Write(const fs::path &keeping, Failures &failures) const {
   std::error_code error;
   fs::create_directories(keeping, error);
   return WriteAtomically(keeping / kJournalFile, text, failures);
+}
+
+bool Journal::Pending(const fs::path &keeping) {
+  std::error_code error;
+  return fs::exists(fs::symlink_status(keeping / kJournalFile, error));
 }
 
 void Journal::Remove(const fs::path &keeping) {

@@ -66,6 +66,8 @@ struct Journal {
   static std::optional<Journal> Read(const std::filesystem::path &keeping, Failures &failures);
   bool Write(const std::filesystem::path &keeping, Failures &failures) const;
   static void Remove(const std::filesystem::path &keeping);
+  // Whether the keeping folder holds a journal, that is, an operation was interrupted.
+  static bool Pending(const std::filesystem::path &keeping);
 };
 
 // The keeping folder of the library `libDir`.

@@ -3,6 +3,7 @@
 #include "base/file_ops.h"
 #include "base/listing.h"
 #include "base/names.h"
+#include "base/plain_name.h"
 #include "library/file_rules.h"
 #include "library/game_places.h"
 #include "library/keeping.h"
@@ -33,6 +34,11 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
       continue;
     const Place place = PlaceOf(name);
     const fs::path source = Child(folder, name);
+    // The ledger takes plain names only, so that no copy is made that an unload cannot find.
+    if (const std::string problem = PlainNameProblem(name); !problem.empty()) {
+      failures.Add(source, "was not loaded: it is " + problem);
+      continue;
+    }
     if (!places.Ensure(place, failures)) {
       failures.Add(source, "not copied, its game folder is missing");
       continue;

@@ -1,6 +1,7 @@
 #include "library/move_out.h"
 
 #include "base/file_ops.h"
+#include "base/links.h"
 #include "base/listing.h"
 #include "base/names.h"
 #include "library/file_rules.h"
@@ -32,7 +33,9 @@ static std::vector<Journal::Entry> ListedCopies(const fs::path &eawDir, const fs
 void MoveOut(LibraryState &state, const fs::path &folder, Caption &caption, Failures &failures) {
   if (!state.Ready)
     return;
-  if (IsCampaignFolder(folder))
+  if (IsCampaignFolder(folder) && IsLink(folder))
+    RefuseLink(folder, "the saved games stay in Savedata", failures);
+  else if (IsCampaignFolder(folder))
     CarrySaveFiles(state.EAWDir, folder, caption, failures);
   if (folder == state.EAWDir)
     return;

@@ -1,9 +1,11 @@
 #include "library/recovery.h"
 
 #include "base/file_ops.h"
+#include "base/links.h"
 #include "base/listing.h"
 #include "base/names.h"
 #include "library/keeping.h"
+#include "library/kept_links.h"
 #include "library/loaded_record.h"
 #include "library/reset_all.h"
 #include "library/unplace.h"
@@ -20,8 +22,9 @@ static void TakeOut(LibraryState &state, const Journal &journal, Caption &captio
   UnplaceFiles(state, ledger, journal.entries, true, caption, failures);
   // A save file carried home into a campaign folder may have been half copied.
   const fs::path folder = Child(state.LibDir, journal.folder);
-  for (const std::string &name : ListFiles(folder, "*.partial"))
-    RemovePartial(Child(folder, name));
+  if (!journal.folder.empty() && !IsLink(folder))
+    for (const std::string &name : ListFiles(folder, "*.partial"))
+      RemovePartial(Child(folder, name));
   ledger.Write(keeping, failures);
   SetRecorded(state, journal.folder, false, failures);
 }
@@ -29,6 +32,9 @@ static void TakeOut(LibraryState &state, const Journal &journal, Caption &captio
 void FinishInterrupted(LibraryState &state, Caption &caption, Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
   RemovePartial(PartialPath(RecordPath(state)));
+  if (Journal::Pending(keeping) &&
+      RefusedForLink(state, {}, "the operation cut short was not finished", failures))
+    return;
   std::optional<Journal> journal = Journal::Read(keeping, failures);
   if (!journal)
     return;
@@ -40,7 +46,8 @@ void FinishInterrupted(LibraryState &state, Caption &caption, Failures &failures
     TakeOut(state, *journal, caption, failures);
     break;
   case Journal::Step::Loaded:
-    SetRecorded(state, journal->folder, true, failures);
+    if (!journal->folder.empty())
+      SetRecorded(state, journal->folder, true, failures);
     break;
   case Journal::Step::Reset:
   case Journal::Step::Restore:

@@ -8,6 +8,7 @@
 #include "base/text_file.h"
 #include "library/game_places.h"
 #include "library/keeping.h"
+#include "library/kept_links.h"
 #include "library/loaded_record.h"
 
 namespace fs = std::filesystem;
@@ -101,6 +102,8 @@ static void UnmarkAllRows(LibraryState &state) {
 
 void ResetAll(LibraryState &state, const std::vector<std::string> &names, Caption &caption,
               Failures &failures) {
+  if (RefusedForLink(state, {}, "nothing was reset", failures))
+    return;
   {
     CaptionRestorer restorer(caption);
     state.Ready = true;

@@ -2,6 +2,7 @@
 
 #include "base/listing.h"
 #include "base/names.h"
+#include "base/plain_name.h"
 #include "base/text_encoding.h"
 #include "base/text_file.h"
 
@@ -17,10 +18,28 @@ bool IsReservedFolderName(std::string_view name) {
   return false;
 }
 
+std::string MusicSetProblem(std::string_view line) {
+  // Windows finds "Set1 " and "Set1." as the folder "Set1": only what it keeps must be plain.
+  const size_t kept = line.find_last_not_of(" .");
+  if (kept != std::string_view::npos)
+    line = line.substr(0, kept + 1);
+  return PlainNameProblem(line);
+}
+
 bool IsMusicSetName(std::string_view line) {
-  if (line == "." || line == ".." || line.find_first_of("\\/:") != std::string_view::npos)
+  return MusicSetProblem(line).empty() && !IsReservedFolderName(line);
+}
+
+// Whether line `number` of Music.ini names a set; one that is no plain name is named in
+// `failures`, a blank one is no name at all.
+static bool IsSetLine(std::string_view line, const fs::path &file, size_t number,
+                      Failures &failures) {
+  if (line.find_first_not_of(" \t") == std::string_view::npos)
     return false;
-  return line.find_first_not_of(" \t") != std::string_view::npos && !IsReservedFolderName(line);
+  const std::string problem = MusicSetProblem(line);
+  if (!problem.empty())
+    RefuseLine(file, number, line, problem, failures);
+  return problem.empty() && !IsReservedFolderName(line);
 }
 
 static std::set<std::string> FoldedFolderNames(const fs::path &folder) {
@@ -32,8 +51,8 @@ static std::set<std::string> FoldedFolderNames(const fs::path &folder) {
 
 MusicList FillMusicList(const fs::path &eawDir, Failures &failures) {
   MusicList list;
-  const std::optional<std::vector<std::string>> lines =
-      ReadLinesIfExists(FindAnyCase(eawDir, "Music.ini"), failures);
+  const fs::path file = FindAnyCase(eawDir, "Music.ini");
+  const std::optional<std::vector<std::string>> lines = ReadLinesIfExists(file, failures);
   if (!lines)
     return list;
   const std::set<std::string> folders = FoldedFolderNames(eawDir);
@@ -42,8 +61,9 @@ MusicList FillMusicList(const fs::path &eawDir, Failures &failures) {
   const auto hasFolder = [&](const std::string &name) {
     return folders.count(FoldName(StoredName(name))) > 0;
   };
-  for (const std::string &line : *lines) {
-    if (!IsMusicSetName(line))
+  for (size_t at = 0; at < lines->size(); ++at) {
+    const std::string &line = (*lines)[at];
+    if (!IsSetLine(line, file, at + 1, failures))
       continue;
     // Names are bytes; a Music.ini written in Windows-1252 names UTF-8 folders as text.
     const std::string text = TextAsUtf8(line);

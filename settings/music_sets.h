@@ -17,9 +17,13 @@ struct MusicList {
 // Whether `name` is a folder the program or the game relies on ("ZEP128", "Savedata", "Music",
 // in any letter case): a switch would rename it away.
 bool IsReservedFolderName(std::string_view name);
-// Whether a Music.ini line can name a set: a plain folder name of the game folder, not blank,
-// not "." or "..", without "\", "/" or ":", and not a reserved folder.
+// Why a Music.ini line cannot name a folder of the game folder, or empty when it can: it must be
+// one plain name (see PlainNameProblem) but for trailing blanks and dots, which Windows drops.
+std::string MusicSetProblem(std::string_view line);
+// Whether a Music.ini line can name a set: MusicSetProblem finds nothing, and it is not a
+// reserved folder.
 bool IsMusicSetName(std::string_view line);
 // The music sets of Music.ini (found whatever its letter case): a name whose folder exists is an
-// entry; the last name without a folder is the current set. A missing file gives nothing.
+// entry; the last name without a folder is the current set. A missing file gives nothing; a line
+// that is not a plain name is named in `failures` and left out.
 MusicList FillMusicList(const std::filesystem::path &eawDir, Failures &failures);

@@ -2,7 +2,9 @@
 
 #include "base/existence.h"
 #include "base/file_ops.h"
+#include "base/links.h"
 #include "base/names.h"
+#include "base/plain_name.h"
 #include "base/text_file.h"
 #include "settings/music_sets.h"
 
@@ -19,6 +21,8 @@ static std::optional<std::string> RenameRefusal(const fs::path &from, const fs::
   FolderCheck(from);
   if (!FolderFound)
     return DisplayPath(from) + " is no folder";
+  if (IsLink(from))
+    return DisplayPath(from) + " " + kLinkReason;
   for (const fs::path &entry : EntriesAnyCase(to.parent_path(), NameText(to)))
     if (entry != from && entry != leaving)
       return DisplayPath(entry) + " is in the way";
@@ -54,7 +58,11 @@ bool SwitchMusic(const fs::path &eawDir, const std::string &activeName,
   const fs::path active = Child(eawDir, activeName);
   const fs::path chosen = FindAnyCase(eawDir, chosenName);
   // Every refusal is decided before the first rename, so that a refused switch changes nothing.
-  std::optional<std::string> refusal = RenameRefusal(music, active);
+  std::optional<std::string> refusal;
+  if (IsLink(journal.parent_path()))
+    refusal = DisplayPath(journal.parent_path()) + " " + kLinkReason;
+  if (!refusal)
+    refusal = RenameRefusal(music, active);
   if (!refusal)
     refusal = RenameRefusal(chosen, Child(eawDir, "Music"), music);
   if (refusal) {
@@ -76,18 +84,46 @@ bool SwitchMusic(const fs::path &eawDir, const std::string &activeName,
   return switched;
 }
 
+// Whether the journal's three lines name the music folder, the set put away and the chosen set;
+// each line that does not is named in `failures`.
+static bool NamesTheSwitch(const std::vector<std::string> &lines, const fs::path &journal,
+                           Failures &failures) {
+  bool named = true;
+  for (size_t at = 0; at < 3; ++at) {
+    const std::string &name = lines[at];
+    std::string problem = MusicSetProblem(name);
+    if (problem.empty() && at == 0 && FoldName(StoredName(name)) != FoldName("Music"))
+      problem = "not the game's music folder";
+    else if (problem.empty() && at > 0 && IsReservedFolderName(name))
+      problem = "a folder the game or this program needs";
+    if (!problem.empty())
+      RefuseLine(journal, at + 1, name, problem, failures);
+    named = named && problem.empty();
+  }
+  return named;
+}
+
 void FinishMusicSwitch(const fs::path &eawDir, const fs::path &journal, Failures &failures) {
-  const auto lines = ReadLinesIfExists(journal, failures);
   std::error_code error;
+  if (IsLink(journal.parent_path())) {
+    if (fs::exists(fs::symlink_status(journal, error)))
+      RefuseLink(journal.parent_path(), "the music switch cut short was not finished", failures);
+    return;
+  }
+  const auto lines = ReadLinesIfExists(journal, failures);
   fs::remove(PartialPath(journal), error);
   if (!lines)
     return;
-  if (lines->size() == 3) {
+  if (lines->size() == 3 && NamesTheSwitch(*lines, journal, failures)) {
     const fs::path music = Child(eawDir, (*lines)[0]);
     FolderCheck(FindAnyCase(eawDir, "Music"));
     if (!FolderFound) {
       FolderCheck(Child(eawDir, (*lines)[2]));
-      Rename(Child(eawDir, FolderFound ? (*lines)[2] : (*lines)[1]), music, failures);
+      const fs::path from = Child(eawDir, FolderFound ? (*lines)[2] : (*lines)[1]);
+      if (IsLink(from))
+        RefuseLink(from, "the music switch cut short was not finished", failures);
+      else
+        Rename(from, music, failures);
     }
   }
   fs::remove(journal, error);

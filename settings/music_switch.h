@@ -14,6 +14,7 @@ bool SwitchMusic(const std::filesystem::path &eawDir, const std::string &activeN
                  const std::string &chosenName, const std::filesystem::path &journal,
                  Failures &failures);
 // Finishes a switch that `journal` shows was cut short: when the game has no "Music" folder, the
-// chosen set becomes it (or, if that is gone, the set put away becomes it again).
+// chosen set becomes it (or, if that is gone, the set put away becomes it again). A journal line
+// that names another folder, and a link in the way, are named in `failures` and change nothing.
 void FinishMusicSwitch(const std::filesystem::path &eawDir, const std::filesystem::path &journal,
                        Failures &failures);
