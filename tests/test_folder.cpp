@@ -1,11 +1,18 @@
 #include "tests/test_folder.h"
 
+#include "base/links.h"
 #include "base/names.h"
 
 #include <atomic>
+#include <chrono>
 #include <fstream>
 #include <iterator>
+#include <thread>
 #include <unistd.h>
+
+#ifdef _WIN32
+#include <windows.h>
+#endif
 
 namespace fs = std::filesystem;
 
@@ -64,3 +71,73 @@ bool IsCaseSensitive(const fs::path &folder) {
   fs::remove(probe);
   return sensitive;
 }
+
+std::map<std::string, std::string> Snapshot(const fs::path &folder, const std::string &skipped) {
+  std::map<std::string, std::string> entries;
+  std::error_code error;
+  for (auto it = fs::recursive_directory_iterator(folder, error);
+       !error && it != fs::recursive_directory_iterator(); it.increment(error)) {
+    const std::string relative = it->path().lexically_relative(folder).generic_string();
+    if (!skipped.empty() && it.depth() == 0 && relative == skipped) {
+      it.disable_recursion_pending();
+      continue;
+    }
+    std::string &entry = entries[relative];
+    if (IsLink(it->path())) {
+      entry = "link";
+      continue;
+    }
+    entry = it->is_directory() ? "folder" : "file";
+    entry += IsWritable(it->path()) ? " writable " : " read-only ";
+    if (it->is_regular_file()) {
+      std::ifstream in(it->path(), std::ios::binary);
+      entry.append(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
+    }
+  }
+  return entries;
+}
+
+#ifdef _WIN32
+// The Unix path of `path` when the program runs under Wine, else empty.
+static std::wstring UnixPath(const fs::path &path) {
+  using Converter = char *(CDECL *)(LPCWSTR);
+  const auto convert = reinterpret_cast<Converter>(reinterpret_cast<void *>(
+      GetProcAddress(GetModuleHandleW(L"kernel32"), "wine_get_unix_file_name")));
+  char *unix = convert ? convert(path.c_str()) : nullptr;
+  if (!unix)
+    return {};
+  const std::wstring text = fs::path(unix).wstring();
+  HeapFree(GetProcessHeap(), 0, unix);
+  return text;
+}
+
+bool MakeFolderLink(const fs::path &target, const fs::path &link) {
+  // Windows lets a program make links only with developer mode or as administrator.
+  if (CreateSymbolicLinkW(link.c_str(), target.c_str(), SYMBOLIC_LINK_FLAG_DIRECTORY | 0x2) &&
+      IsLink(link))
+    return true;
+  // Wine 8 answers that call with success and makes nothing, but shows a folder link of the Unix
+  // file system as a folder with a reparse point: its own "ln" makes one. (A link to a file it
+  // shows as a plain file, so file links cannot be tested under Wine.)
+  const std::wstring from = UnixPath(target), to = UnixPath(link);
+  std::wstring command = L"ln -s \"" + from + L"\" \"" + to + L"\"";
+  STARTUPINFOW startup{};
+  startup.cb = sizeof startup;
+  PROCESS_INFORMATION process{};
+  if (from.empty() || !CreateProcessW(L"Z:\\bin\\ln", command.data(), nullptr, nullptr, FALSE, 0,
+                                      nullptr, nullptr, &startup, &process))
+    return false;
+  CloseHandle(process.hThread);
+  CloseHandle(process.hProcess);
+  // Wine does not wait for a Unix process: the link is awaited instead.
+  for (int wait = 0; wait < 100 && !IsLink(link); ++wait)
+    std::this_thread::sleep_for(std::chrono::milliseconds(50));
+  return IsLink(link);
+}
+#else
+bool MakeFolderLink(const fs::path &target, const fs::path &link) {
+  std::error_code error;
+  fs::create_directory_symlink(target, link, error);
+  return !error;
+}
+#endif

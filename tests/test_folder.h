@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <map>
 #include <string>
 
 // A fresh folder under the system's temporary folder, removed with everything in it at the end.
@@ -29,3 +30,9 @@ bool IsCaseSensitive(const std::filesystem::path &folder);
 bool IsWritable(const std::filesystem::path &path);
 // Makes `path` read-only (or writable again).
 void SetReadOnly(const std::filesystem::path &path, bool readOnly);
+// Every entry below `folder` but those below its child `skipped`, without following links: its
+// kind, whether it is writable and a file's bytes, by path.
+std::map<std::string, std::string> Snapshot(const std::filesystem::path &folder,
+                                            const std::string &skipped = "");
+// Makes `link` a link to the folder `target`; false where this program may make none.
+bool MakeFolderLink(const std::filesystem::path &target, const std::filesystem::path &link);

@@ -1,0 +1,144 @@
+#include "app/selector.h"
+#include "tests/game_folder.h"
+
+#include <gtest/gtest.h>
+
+#include <random>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+// A game folder "game" inside a larger temporary folder, beside the "outside" files that hostile
+// names in the program's own files aim at.
+class OuterGame : public ::testing::Test {
+protected:
+  void SetUp() override {
+    for (const char *file : {"ZEP128/N-One/planes.dat", "ZEP128/N-Two/sky.spt", "Savedata/a.msn",
+                             "Music/a.bgm", "Set1/b.bgm"})
+      outer.Write(std::string("game/") + file);
+    outer.Write("game/ZEP128/zep.ini", "Sounds: N\r\n");
+    outer.Write("game/Music.ini", "Set1\r\nSet2\r\n");
+    for (const char *file : {"outside/victim.dat", "outside/left.partial", "outside/victim/in.dat"})
+      outer.Write(file, "outside");
+    before = Snapshot(outer.Path(), "game");
+  }
+  // Writes the program's file `relative` of the game folder; with both folders recorded loaded.
+  void WriteState(const std::string &relative, const std::string &bytes) const {
+    outer.Write("game/ZEP128/FoldersLoaded.txt", "N-One\r\nN-Two\r\n");
+    outer.Write("game/" + relative, bytes);
+  }
+  // Starts the program, unloads every loaded folder and resets all.
+  void StartAndUnloadAll() {
+    Selector selector(game, caption, starter);
+    selector.StartUp(failures);
+    for (int row = 1; row < selector.State().Unigrid.RowCount(); ++row)
+      if (IsLoaded(selector.State().Unigrid.Row(row)))
+        selector.ClickRow(row, failures);
+    selector.ResetAll(selector.ResetAllFiles(failures), failures);
+  }
+  std::string Absolute(const std::string &relative) const {
+    const std::u8string text = (outer.Path() / relative).make_preferred().u8string();
+    return std::string(text.begin(), text.end());
+  }
+
+  TestFolder outer;
+  fs::path game = outer.Path() / "game";
+  std::map<std::string, std::string> before;
+  RecordingCaption caption;
+  NotingStarter starter;
+  Failures failures;
+};
+
+// A line of one of the program's files that takes a name, and what the name aims at outside.
+struct StateLine {
+  const char *file;
+  const char *before; // the file up to the name
+  int line;
+  const char *up; // from where the name is taken up to the larger folder
+  const char *aim;
+};
+
+class HostileName : public OuterGame, public ::testing::WithParamInterface<StateLine> {};
+
+} // namespace
+
+TEST_P(HostileName, IsRefusedWithItsFileAndLineAndTouchesNothingOutside) {
+  const StateLine &state = GetParam();
+  for (const std::string &name :
+       {std::string(state.up) + state.aim, Absolute(state.aim), std::string("nul.txt")}) {
+    // A music journal acts only when the game has no music folder.
+    fs::remove_all(game / "Music");
+    WriteState(state.file, state.before + name + "\r\n");
+    StartAndUnloadAll();
+    EXPECT_EQ(Snapshot(outer.Path(), "game"), before) << name;
+    const std::string refusal =
+        state.file + std::string(": line ") + std::to_string(state.line) + " was ignored";
+    EXPECT_NE(failures.Message("").find(refusal), std::string::npos) << failures.Message("");
+    failures = {};
+  }
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    StateFiles, HostileName,
+    ::testing::Values(
+        StateLine{"ZEP128/#Selector/journal.txt", "unload\r\nN-One\r\n\tG-", 3, "../",
+                  "outside/victim.dat"},
+        StateLine{"ZEP128/#Selector/journal.txt", "load\r\n", 2, "../../", "outside"},
+        StateLine{"ZEP128/#Selector/loaded.txt", "N-One\r\n\tG ", 2, "../", "outside/victim.dat"},
+        StateLine{"ZEP128/#Selector/music.txt", "Music\r\nSet1\r\n", 3, "../", "outside/victim"}));
+
+TEST_F(OuterGame, RandomStateFilesTouchNothingOutsideTheGameFolder) {
+  const std::string pieces[] = {"..",
+                                "../outside/victim.dat",
+                                "..\\outside\\victim.dat",
+                                "../../outside",
+                                "../outside/victim",
+                                Absolute("outside"),
+                                Absolute("outside/victim.dat"),
+                                "C:victim.dat",
+                                "/",
+                                "\\",
+                                "NUL",
+                                "con.txt",
+                                "COM1",
+                                std::string(1, '\0'),
+                                "\t",
+                                std::string(300, 'x'),
+                                "victim.dat",
+                                "planes.dat",
+                                "N-One",
+                                "Music",
+                                "Set1",
+                                ".",
+                                " ",
+                                "left.partial"};
+  std::mt19937 random(18);
+  const auto pick = [&](size_t count) { return random() % count; };
+  const auto name = [&] {
+    std::string text;
+    for (size_t count = 1 + pick(3); count > 0; --count)
+      text += pieces[pick(std::size(pieces))];
+    return text;
+  };
+  const auto fileLines = [&](size_t count) {
+    std::string text;
+    for (; count > 0; --count)
+      text += std::string("\t") + "GSMX"[pick(4)] + "+- "[pick(3)] + name() + "\r\n";
+    return text;
+  };
+  const char *steps[] = {"load", "loaded", "unload", "reset", "restore"};
+  for (int round = 0; round < 40; ++round) {
+    if (pick(2) == 0)
+      fs::remove_all(game / "Music");
+    WriteState("ZEP128/#Selector/journal.txt",
+               std::string(steps[pick(5)]) + "\r\n" + name() + "\r\n" + fileLines(pick(6)));
+    WriteState("ZEP128/#Selector/loaded.txt", "N-One\r\n" + fileLines(pick(4)) + name() + "\r\n" +
+                                                  fileLines(pick(4)) + "N-Two\r\n" +
+                                                  fileLines(pick(4)));
+    WriteState("ZEP128/#Selector/music.txt",
+               (pick(2) ? "Music\r\n" : name() + "\r\n") + name() + "\r\n" + name() + "\r\n");
+    StartAndUnloadAll();
+    ASSERT_EQ(Snapshot(outer.Path(), "game"), before) << "round " << round;
+  }
+}
