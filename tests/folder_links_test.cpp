@@ -1,0 +1,58 @@
+#include "app/selector.h"
+#include "base/links.h"
+#include "base/names.h"
+#include "tests/selector_fixture.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+// A game whose folder `GetParam()`, one where the program keeps or writes things, is a link to a
+// folder outside the game folder that holds a read-only file.
+class FolderLink : public SelectorTest, public ::testing::WithParamInterface<const char *> {
+protected:
+  void SetUp() override {
+    game.WithGameFolders().WithCategories("Sounds: N\r\n").WithRecord("");
+    game.Addon("N-One", {"bases.dat", "a.msn", "x.bgm"});
+    game.Write("bases.dat", "the game's own");
+    game.Write("Music.ini", "Set1\r\nSet2\r\n");
+    game.Write("Set1/a.bgm");
+    game.MakeFolder("ZEP128/#Selector/originals");
+    SetReadOnly(outside.Write("dir/bases.dat", "outside"), true);
+    before = Snapshot(outside.Path());
+  }
+
+  TestFolder outside;
+  std::map<std::string, std::string> before;
+};
+
+} // namespace
+
+TEST_P(FolderLink, IsNamedAndNothingIsWrittenMovedOrChangedThroughIt) {
+  const fs::path link = Child(game.Path(), GetParam());
+  fs::remove_all(link);
+  if (!MakeFolderLink(outside.Path() / "dir", link))
+    GTEST_SKIP() << "this system lets the test make no folder link";
+  selector.StartUp(failures);
+  selector.ClickRow(1, failures);
+  selector.ClickRow(1, failures);
+  selector.ResetAll(selector.ResetAllFiles(failures), failures);
+  selector.SwitchMusic("Set2", "Set1", failures);
+  EXPECT_EQ(Snapshot(outside.Path()), before);
+  EXPECT_TRUE(IsLink(link));
+  EXPECT_TRUE(std::any_of(failures.Lines().begin(), failures.Lines().end(),
+                          [&](const std::string &line) {
+                            return line.find(DisplayPath(link)) != line.npos &&
+                                   line.find("is a link") != line.npos;
+                          }))
+      << failures.Message("");
+}
+
+INSTANTIATE_TEST_SUITE_P(WhereThingsAreKept, FolderLink,
+                         ::testing::Values("ZEP128/#Selector", "ZEP128/#Selector/originals",
+                                           "ZEP128/#Selector/originals/G", "Savedata", "Music",
+                                           "ZEP128/N-One", "Set1"));
