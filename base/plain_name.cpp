@@ -17,9 +17,12 @@ bool IsDeviceName(std::string_view name) {
   if (std::find(kDevices.begin(), kDevices.end(), trimmed) != kDevices.end()) {
     return true;
   }
-  const bool numbered =
-      trimmed.size() == 4 && (trimmed.starts_with("COM") || trimmed.starts_with("LPT"));
-  return numbered && trimmed[3] >= '1' && trimmed[3] <= '9';
+  if (!trimmed.starts_with("COM") && !trimmed.starts_with("LPT"))
+    return false;
+  const std::string_view number = trimmed.substr(3);
+  // Windows counts the superscript digits one to three ("COM¹") among the port numbers.
+  return (number.size() == 1 && number[0] >= '1' && number[0] <= '9') || number == "\xC2\xB9" ||
+         number == "\xC2\xB2" || number == "\xC2\xB3";
 }
 
 bool HasForbiddenByte(std::string_view name) {
