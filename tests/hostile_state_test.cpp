@@ -1,4 +1,5 @@
 #include "app/selector.h"
+#include "base/names.h"
 #include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
@@ -38,8 +39,7 @@ protected:
     selector.ResetAll(selector.ResetAllFiles(failures), failures);
   }
   std::string Absolute(const std::string &relative) const {
-    const std::u8string text = (outer.Path() / relative).make_preferred().u8string();
-    return std::string(text.begin(), text.end());
+    return DisplayPath(outer.Path() / relative);
   }
 
   TestFolder outer;
@@ -73,7 +73,7 @@ TEST_P(HostileName, IsRefusedWithItsFileAndLineAndTouchesNothingOutside) {
     StartAndUnloadAll();
     EXPECT_EQ(Snapshot(outer.Path(), "game"), before) << name;
     const std::string refusal =
-        state.file + std::string(": line ") + std::to_string(state.line) + " was ignored";
+        DisplayPath(game / state.file) + ": line " + std::to_string(state.line) + " was ignored";
     EXPECT_NE(failures.Message("").find(refusal), std::string::npos) << failures.Message("");
     failures = {};
   }
