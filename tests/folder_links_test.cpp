@@ -11,6 +11,7 @@ namespace fs = std::filesystem;
 
 namespace {
 
+// Links to files are tested in links_posix_test.cpp only: Wine shows one as the file it names.
 // A game whose folder `GetParam()`, one where the program keeps or writes things, is a link to a
 // folder outside the game folder that holds a read-only file.
 class FolderLink : public SelectorTest, public ::testing::WithParamInterface<const char *> {
