@@ -86,6 +86,7 @@ INSTANTIATE_TEST_SUITE_P(
                   "outside/victim.dat"},
         StateLine{"ZEP128/#Selector/journal.txt", "load\r\n", 2, "../../", "outside"},
         StateLine{"ZEP128/#Selector/loaded.txt", "N-One\r\n\tG ", 2, "../", "outside/victim.dat"},
+        StateLine{"ZEP128/#Selector/loaded.txt", "", 1, "../../", "outside"},
         StateLine{"ZEP128/#Selector/music.txt", "Music\r\nSet1\r\n", 3, "../", "outside/victim"}));
 
 TEST_F(OuterGame, RandomStateFilesTouchNothingOutsideTheGameFolder) {
