@@ -95,6 +95,7 @@ TEST_F(OuterGame, RandomStateFilesTouchNothingOutsideTheGameFolder) {
                                 "..\\outside\\victim.dat",
                                 "../../outside",
                                 "../outside/victim",
+                                "../../outside/victim.dat",
                                 Absolute("outside"),
                                 Absolute("outside/victim.dat"),
                                 "C:victim.dat",
@@ -118,14 +119,15 @@ TEST_F(OuterGame, RandomStateFilesTouchNothingOutsideTheGameFolder) {
   const auto pick = [&](size_t count) { return random() % count; };
   const auto name = [&] {
     std::string text;
-    for (size_t count = 1 + pick(3); count > 0; --count)
+    // Half the names are one piece, so that whole paths come often.
+    for (size_t count = pick(2) ? 1 : 2 + pick(2); count > 0; --count)
       text += pieces[pick(std::size(pieces))];
     return text;
   };
   const auto fileLines = [&](size_t count) {
     std::string text;
     for (; count > 0; --count)
-      text += std::string("\t") + "GSMX"[pick(4)] + "+- "[pick(3)] + name() + "\r\n";
+      text += std::string("\t") + "GGSMX"[pick(5)] + "+- "[pick(3)] + name() + "\r\n";
     return text;
   };
   const char *steps[] = {"load", "loaded", "unload", "reset", "restore"};
