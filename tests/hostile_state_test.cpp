@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include <random>
+#include <sstream>
 
 namespace fs = std::filesystem;
 
@@ -90,38 +91,23 @@ INSTANTIATE_TEST_SUITE_P(
         StateLine{"ZEP128/#Selector/music.txt", "Music\r\nSet1\r\n", 3, "../", "outside/victim"}));
 
 TEST_F(OuterGame, RandomStateFilesTouchNothingOutsideTheGameFolder) {
-  const std::string pieces[] = {"..",
-                                "../outside/victim.dat",
-                                "..\\outside\\victim.dat",
-                                "../../outside",
-                                "../outside/victim",
-                                "../../outside/victim.dat",
-                                Absolute("outside"),
-                                Absolute("outside/victim.dat"),
-                                "C:victim.dat",
-                                "/",
-                                "\\",
-                                "NUL",
-                                "con.txt",
-                                "COM1",
-                                std::string(1, '\0'),
-                                "\t",
-                                std::string(300, 'x'),
-                                "victim.dat",
-                                "planes.dat",
-                                "N-One",
-                                "Music",
-                                "Set1",
-                                ".",
-                                " ",
-                                "left.partial"};
+  // Pieces of names, between "|": the first seven aim outside the game folder; the others are
+  // drives, devices, control bytes, long names and names of the game.
+  std::vector<std::string> pieces = {Absolute("outside"), Absolute("outside/victim.dat")};
+  std::istringstream list(
+      "../outside/victim.dat|..\\outside\\victim.dat|../../outside|"
+      "../outside/victim|../../outside/victim.dat|..|C:victim.dat|/|\\|NUL|"
+      "con.txt|COM1|\t|victim.dat|planes.dat|N-One|Music|Set1|.| |left.partial");
+  for (std::string piece; std::getline(list, piece, '|');)
+    pieces.push_back(piece);
+  pieces.insert(pieces.end(), {std::string(1, '\0'), std::string(300, 'x')});
   std::mt19937 random(18);
   const auto pick = [&](size_t count) { return random() % count; };
+  // Half the names aim outside whole; the others join one to three pieces of any kind.
   const auto name = [&] {
-    std::string text;
-    // Half the names are one piece, so that whole paths come often.
-    for (size_t count = pick(2) ? 1 : 2 + pick(2); count > 0; --count)
-      text += pieces[pick(std::size(pieces))];
+    std::string text = pick(2) ? pieces[pick(7)] : "";
+    for (size_t count = text.empty() ? 1 + pick(3) : 0; count > 0; --count)
+      text += pieces[pick(pieces.size())];
     return text;
   };
   const auto fileLines = [&](size_t count) {
