@@ -58,3 +58,20 @@ INSTANTIATE_TEST_SUITE_P(WhereThingsAreKept, FolderLink,
                          ::testing::Values("ZEP128/#Selector", "ZEP128/#Selector/originals",
                                            "ZEP128/#Selector/originals/G", "Savedata", "Music",
                                            "ZEP128/N-One", "Set1"));
+
+TEST_F(FolderLink, ACampaignThatBecameALinkIsUnloadedAndItsSavedGamesStay) {
+  game.WithCategories("Campaigns: C\r\n").Addon("C-One", {"m.msn"});
+  selector.StartUp(failures);
+  selector.ClickRow(1, failures);
+  game.Write("Savedata/game.sve", "progress");
+  fs::rename(game.Path() / "ZEP128/C-One", outside.Path() / "C-One");
+  if (!MakeFolderLink(outside.Path() / "C-One", game.Path() / "ZEP128/C-One"))
+    GTEST_SKIP() << "this system lets the test make no folder link";
+  const std::map<std::string, std::string> before = Snapshot(outside.Path());
+  selector.ClickRow(1, failures);
+  EXPECT_EQ(Snapshot(outside.Path()), before);
+  EXPECT_EQ(game.Read("Savedata/game.sve"), "progress");
+  EXPECT_FALSE(game.Exists("Savedata/m.msn"));
+  ASSERT_EQ(failures.Lines().size(), 1u) << failures.Message("");
+  EXPECT_NE(failures.Lines()[0].find("the saved games stay in Savedata"), std::string::npos);
+}
