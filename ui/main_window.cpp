@@ -290,7 +290,7 @@ QString MainWindow::EditorText() const {
   return text;
 }
 
-void MainWindow::FillMusicList() {
+void MainWindow::FillMusicList(bool tell) {
   Failures failures;
   const MusicList music = selector_.MusicSets(failures);
   c_.List4->clear();
@@ -302,7 +302,8 @@ void MainWindow::FillMusicList() {
     currentMusic_ = *music.current;
     c_.Label11->setText(FromName(*music.current));
   }
-  ShowFailures(this, failures, "The music sets could not be read:");
+  if (tell)
+    ShowFailures(this, failures, "The music sets could not be read:");
 }
 
 void MainWindow::List4_Click(QListWidgetItem *item) {
@@ -312,7 +313,8 @@ void MainWindow::List4_Click(QListWidgetItem *item) {
     selector_.SwitchMusic(currentMusic_, item->data(Qt::UserRole).toByteArray().toStdString(),
                           failures);
   }
-  FillMusicList();
+  // What Music.ini holds was said at the start, not again at each switch.
+  FillMusicList(false);
   ShowFailures(this, failures, "The music could not be switched:");
 }
 

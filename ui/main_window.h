@@ -43,7 +43,8 @@ private:
   void inisave();
   void IniEdit_Click();
   void InSaver_Click();
-  void FillMusicList();
+  // Fills the music list; with `tell`, says which lines of Music.ini name no set.
+  void FillMusicList(bool tell = true);
   void List4_Click(QListWidgetItem *item);
   void delmsn_Click();
   void ShowScreenSize();
