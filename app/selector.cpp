@@ -173,9 +173,9 @@ std::vector<std::string> Selector::Setups() const { return SetupNames(state_.Lib
 bool Selector::HasSetup(const std::string &name) const { return SetupExists(state_.LibDir, name); }
 
 bool Selector::SaveSetup(const std::string &name, Failures &failures) {
-  const size_t before = failures.Lines().size();
+  // A ledger that cannot be read leaves the grid's order, which is still worth keeping.
   const std::vector<std::string> loaded = LoadedInOrder(state_, failures);
-  if (failures.Lines().size() > before || !WriteSetup(state_.LibDir, name, loaded, failures))
+  if (!WriteSetup(state_.LibDir, name, loaded, failures))
     return false;
   state_.summary =
       "Saved " + std::to_string(loaded.size()) + " loaded folders as \"" + name + "\".";

@@ -26,6 +26,15 @@ fs::path SetupPath(const fs::path &libDir, std::string_view name) {
 
 std::string Quoted(std::string_view text) { return "\"" + std::string(text) + "\""; }
 
+// A linked setups folder could lead anywhere: it is neither read nor written.
+bool LinkedFolder(const fs::path &libDir, Failures &failures) {
+  std::error_code error;
+  if (!fs::is_symlink(SetupsFolder(libDir), error))
+    return false;
+  failures.Add(SetupsFolder(libDir), "is a link, which the program does not follow");
+  return true;
+}
+
 // A line as a hand-written file may give it: blanks and tabs at its end are no part of a name
 // (Windows cannot keep them).
 std::string Trimmed(const std::string &line) {
@@ -70,6 +79,9 @@ std::string SetupNameProblem(std::string_view name) {
 
 std::vector<std::string> SetupNames(const fs::path &libDir) {
   std::vector<std::string> names;
+  std::error_code error;
+  if (fs::is_symlink(SetupsFolder(libDir), error))
+    return names;
   for (const std::string &file : ListFiles(SetupsFolder(libDir), "*.txt")) {
     const std::string name = file.substr(0, file.size() - kExtension.size());
     if (SetupNameProblem(name).empty())
@@ -93,6 +105,8 @@ std::optional<std::vector<std::string>> ReadSetup(const fs::path &libDir, std::s
   };
   if (const std::string problem = SetupNameProblem(name); !problem.empty())
     return refuse(problem + ".");
+  if (LinkedFolder(libDir, failures))
+    return refuse("its folder is a link.");
   const fs::path path = SetupPath(libDir, name);
   std::error_code error;
   const fs::file_status status = fs::symlink_status(path, error);
@@ -121,12 +135,16 @@ bool WriteSetup(const fs::path &libDir, std::string_view name,
     failures.Add(Quoted(name) + " cannot name a setup: it is " + problem);
     return false;
   }
+  if (LinkedFolder(libDir, failures))
+    return false;
   std::error_code error;
   fs::create_directories(SetupsFolder(libDir), error);
   return WriteAtomically(SetupPath(libDir, name), JoinCrLf(folders), failures);
 }
 
 bool RemoveSetup(const fs::path &libDir, std::string_view name, Failures &failures) {
+  if (LinkedFolder(libDir, failures))
+    return false;
   if (!SetupExists(libDir, name)) {
     failures.Add("There is no setup " + Quoted(name) + " to delete.");
     return false;
