@@ -65,6 +65,11 @@ static std::string WithLines(std::string notice, const std::vector<std::string> 
   return notice;
 }
 
+// "1 folder", "2 folders".
+static std::string Count(size_t count, const std::string &what) {
+  return std::to_string(count) + " " + what + (count == 1 ? "" : "s");
+}
+
 // "120 files copied, 2 deleted, 1 put back": what an operation did, for the player to see.
 static std::string TallyText(const Tally &tally) {
   std::string text;
@@ -119,9 +124,9 @@ std::vector<std::string> Selector::ResetAllFiles(Failures &failures) const {
 void Selector::ResetAll(const std::vector<std::string> &names, Failures &failures) {
   // The way back: switching to this setup loads again what the reset unloads.
   if (!SaveSetup(kBeforeResetAllSetup, failures)) {
-    failures.SetHeading("Nothing was reset: the loaded folders could not be saved as the setup "
-                        "\"" +
-                        std::string(kBeforeResetAllSetup) + "\" first.");
+    failures.SetHeading(std::string("Nothing was reset: the loaded folders could not be saved "
+                                    "first as the setup \"") +
+                        kBeforeResetAllSetup + "\".");
     return;
   }
   state_.tally = {};
@@ -177,8 +182,7 @@ bool Selector::SaveSetup(const std::string &name, Failures &failures) {
   const std::vector<std::string> loaded = LoadedInOrder(state_, failures);
   if (!WriteSetup(state_.LibDir, name, loaded, failures))
     return false;
-  state_.summary =
-      "Saved " + std::to_string(loaded.size()) + " loaded folders as \"" + name + "\".";
+  state_.summary = "Saved " + Count(loaded.size(), "loaded folder") + " as \"" + name + "\".";
   return true;
 }
 
@@ -189,8 +193,8 @@ std::string Selector::SwitchToSetup(const std::string &name, Failures &failures)
   if (!folders)
     return "";
   const SwitchResult result = SwitchToFolders(state_, *folders, caption_, failures);
-  state_.summary = "Switched to \"" + name + "\": " + std::to_string(result.unloaded) +
-                   " folders unloaded, " + std::to_string(result.loaded) + " loaded; " +
+  state_.summary = "Switched to \"" + name + "\": " + Count(result.unloaded, "folder") +
+                   " unloaded, " + std::to_string(result.loaded) + " loaded; " +
                    TallyText(state_.tally) + ".";
   std::string notice;
   for (const std::string &line : result.notices)

@@ -86,6 +86,9 @@ TEST_F(Setups, ResetAllSavesTheWayBackAndSwitchingUndoesIt) {
   EXPECT_EQ(Loaded(), (Names{"S-a", "N-x"}));
   EXPECT_EQ(game.Read("orig.dat"), "orig.dat");
   EXPECT_EQ(game.Read("shared.dat"), "x");
+  selector.SwitchToSetup("Before Reset All", failures);
+  EXPECT_EQ(selector.State().summary,
+            "Switched to \"Before Reset All\": 0 folders unloaded, 0 loaded; no file changed.");
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
   EXPECT_TRUE(selector.DeleteSetup("before reset all", failures));
   EXPECT_EQ(selector.Setups(), Names{});

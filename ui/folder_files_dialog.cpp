@@ -47,6 +47,8 @@ QTableView *FilesTable(QDialog *dialog, FolderFileList list) {
   table->setEditTriggers(QAbstractItemView::NoEditTriggers);
   table->setWordWrap(false);
   table->verticalHeader()->hide();
+  table->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+  table->verticalHeader()->setDefaultSectionSize(table->fontMetrics().height() + 4);
   // Fixed widths: measuring thousands of rows would make the dialog slow to open.
   const int widths[] = {180, 90, 330};
   for (int column = 0; column < 3; ++column)
