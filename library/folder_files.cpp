@@ -1,11 +1,9 @@
 #include "library/folder_files.h"
 
 #include "base/listing.h"
-#include "base/names.h"
 #include "library/game_places.h"
 #include "library/keeping.h"
 
-#include <algorithm>
 #include <unordered_map>
 #include <unordered_set>
 

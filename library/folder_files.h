@@ -5,6 +5,7 @@
 #include "library/library_state.h"
 
 #include <string>
+#include <utility>
 #include <vector>
 
 // Where a file of an add-on folder stands in the game now.

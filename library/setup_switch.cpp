@@ -4,7 +4,6 @@
 #include "library/grid_click.h"
 #include "library/keeping.h"
 
-#include <algorithm>
 #include <map>
 #include <unordered_map>
 #include <unordered_set>

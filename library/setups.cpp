@@ -7,7 +7,6 @@
 #include "base/text_file.h"
 #include "library/keeping.h"
 
-#include <algorithm>
 #include <system_error>
 
 namespace fs = std::filesystem;
