@@ -10,6 +10,8 @@
 #include "library/record_replay.h"
 #include "library/recovery.h"
 #include "library/reset_all.h"
+#include "library/setup_switch.h"
+#include "library/setups.h"
 #include "settings/game_start.h"
 #include "settings/ini_editor.h"
 #include "settings/music_switch.h"
@@ -56,6 +58,18 @@ static std::string ReplacedNotice(const std::string &loaded,
          loaded + "\" puts their files back.";
 }
 
+// The notice, then a line per replaced file.
+static std::string WithLines(std::string notice, const std::vector<std::string> &lines) {
+  for (const std::string &line : lines)
+    notice += "\n" + line;
+  return notice;
+}
+
+// "1 folder", "2 folders".
+static std::string Count(size_t count, const std::string &what) {
+  return std::to_string(count) + " " + what + (count == 1 ? "" : "s");
+}
+
 // "120 files copied, 2 deleted, 1 put back": what an operation did, for the player to see.
 static std::string TallyText(const Tally &tally) {
   std::string text;
@@ -82,7 +96,9 @@ std::string Selector::ClickRow(int row, Failures &failures) {
   const std::string &name = state_.Unigrid.Row(row).name;
   state_.summary =
       (wasLoaded ? "Unloaded \"" : "Loaded \"") + name + "\": " + TallyText(state_.tally) + ".";
-  return replaced.empty() ? "" : ReplacedNotice(name, replaced);
+  if (replaced.empty())
+    return "";
+  return WithLines(ReplacedNotice(name, replaced), ReplacedFileLines(state_, name, failures));
 }
 
 std::string Selector::PressKey(int row, int key, Failures &failures) {
@@ -106,6 +122,13 @@ std::vector<std::string> Selector::ResetAllFiles(Failures &failures) const {
 }
 
 void Selector::ResetAll(const std::vector<std::string> &names, Failures &failures) {
+  // The way back: switching to this setup loads again what the reset unloads.
+  if (!SaveSetup(kBeforeResetAllSetup, failures)) {
+    failures.SetHeading(std::string("Nothing was reset: the loaded folders could not be saved "
+                                    "first as the setup \"") +
+                        kBeforeResetAllSetup + "\".");
+    return;
+  }
   state_.tally = {};
   ::ResetAll(state_, names, caption_, failures);
   state_.summary = "Reset All: " + TallyText(state_.tally) + ".";
@@ -145,3 +168,44 @@ bool Selector::SwitchMusic(const std::string &activeName, const std::string &cho
 void Selector::StartGame(Failures &failures) { ::StartGame(state_.EAWDir, starter_, failures); }
 
 fs::path Selector::MusicJournal() const { return KeepingFolder(state_.LibDir) / "music.txt"; }
+
+std::vector<std::string> Selector::LoadedFolderNames(Failures &failures) const {
+  return LoadedInOrder(state_, failures);
+}
+
+std::vector<std::string> Selector::Setups() const { return SetupNames(state_.LibDir); }
+
+bool Selector::HasSetup(const std::string &name) const { return SetupExists(state_.LibDir, name); }
+
+bool Selector::SaveSetup(const std::string &name, Failures &failures) {
+  // A ledger that cannot be read leaves the grid's order, which is still worth keeping.
+  const std::vector<std::string> loaded = LoadedInOrder(state_, failures);
+  if (!WriteSetup(state_.LibDir, name, loaded, failures))
+    return false;
+  state_.summary = "Saved " + Count(loaded.size(), "loaded folder") + " as \"" + name + "\".";
+  return true;
+}
+
+std::string Selector::SwitchToSetup(const std::string &name, Failures &failures) {
+  state_.tally = {};
+  state_.summary.clear();
+  const std::optional<std::vector<std::string>> folders = ReadSetup(state_.LibDir, name, failures);
+  if (!folders)
+    return "";
+  const SwitchResult result = SwitchToFolders(state_, *folders, caption_, failures);
+  state_.summary = "Switched to \"" + name + "\": " + Count(result.unloaded, "folder") +
+                   " unloaded, " + std::to_string(result.loaded) + " loaded; " +
+                   TallyText(state_.tally) + ".";
+  std::string notice;
+  for (const std::string &line : result.notices)
+    notice += (notice.empty() ? "" : "\n") + line;
+  return notice;
+}
+
+bool Selector::DeleteSetup(const std::string &name, Failures &failures) {
+  return RemoveSetup(state_.LibDir, name, failures);
+}
+
+FolderFileList Selector::FolderFiles(int row, Failures &failures) const {
+  return ListFolderFiles(state_, row, failures);
+}

@@ -4,6 +4,7 @@
 #include "base/caption.h"
 #include "base/failures.h"
 #include "base/program_starter.h"
+#include "library/folder_files.h"
 #include "library/preview.h"
 #include "settings/eaw_ini.h"
 #include "settings/music_sets.h"
@@ -29,7 +30,8 @@ public:
   // Shows category list entry `entry`; returns the text of the code-letter label.
   std::string ShowCategory(int entry);
   // Loads or unloads the folder of grid row `row` (a click on it). Returns what the player should
-  // know beyond failures: which loaded folders' files a load replaced; empty when nothing.
+  // know beyond failures: which loaded folders' files a load replaced, on its first line, then
+  // one line per replaced file; empty when nothing.
   std::string ClickRow(int row, Failures &failures);
   // A key pressed on grid row `row`: Enter acts as a click.
   std::string PressKey(int row, int key, Failures &failures);
@@ -62,6 +64,25 @@ public:
                    Failures &failures);
   // Starts the game.
   void StartGame(Failures &failures);
+
+  // The loaded folders in the order they were loaded.
+  std::vector<std::string> LoadedFolderNames(Failures &failures) const;
+  // The names of the saved setups, in name order.
+  std::vector<std::string> Setups() const;
+  // Whether a setup of that name exists (in any letter case).
+  bool HasSetup(const std::string &name) const;
+  // Saves the loaded folders, in load order, as setup `name`, replacing one of that name. False,
+  // with the reason, when the name is unusable or the file cannot be written.
+  bool SaveSetup(const std::string &name, Failures &failures);
+  // Unloads the loaded folders setup `name` does not hold and loads those it holds, in its order,
+  // as clicks would. Returns what the player should know beyond failures (folders the category
+  // rules left out); a setup file that is not a plain list of folder names is refused whole.
+  std::string SwitchToSetup(const std::string &name, Failures &failures);
+  // Deletes setup `name`; false, with the reason, when it cannot.
+  bool DeleteSetup(const std::string &name, Failures &failures);
+  // The files of the folder of grid row `row`, where each goes and its state now, and the other
+  // folders that provide the same names.
+  FolderFileList FolderFiles(int row, Failures &failures) const;
 
 private:
   std::filesystem::path MusicJournal() const;

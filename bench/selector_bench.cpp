@@ -1,10 +1,11 @@
 // Measures the program's file work and start-up as ratios against plain baselines in paired
 // rounds, on tmpfs when the machine has one and on the temporary folder's own file system.
-// Usage: selector_bench [pairs]   (at least 9; 9 when not given). It starts itself with
-// "--show-window <game folder>" for each timed start-up.
+// Usage: selector_bench [pairs [setups]]   (at least 9; 9 when not given; "setups" runs only the
+// setup lines). It starts itself with "--show-window <game folder>" for each timed start-up.
 
 #include "bench/file_work.h"
 #include "bench/paired_rounds.h"
+#include "bench/setup_work.h"
 #include "bench/startup_work.h"
 
 #include <QApplication>
@@ -79,8 +80,12 @@ int main(int argc, char **argv) {
     fs::create_directories(root);
     PrintHeading("== " + base.string() + " (" + MountOf(base) + "), " + std::to_string(pairs) +
                  " pairs ==");
-    BenchFileWork(root, pairs);
-    BenchStartUp(root, pairs);
+    const bool setupsOnly = argc > 2 && std::string(argv[2]) == "setups";
+    if (!setupsOnly)
+      BenchFileWork(root, pairs);
+    BenchSetups(root, pairs);
+    if (!setupsOnly)
+      BenchStartUp(root, pairs);
     fs::remove_all(root);
   }
   return 0;

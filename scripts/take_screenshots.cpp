@@ -1,10 +1,17 @@
 // take_screenshots <game folder> <output folder>: starts the window on a game folder and saves a
 // picture of each tab page, for the README.
+#include "platform/qt_paths.h"
 #include "ui/main_window.h"
 
+#include <QAction>
 #include <QApplication>
+#include <QContextMenuEvent>
+#include <QDialog>
 #include <QDir>
 #include <QElapsedTimer>
+#include <QMenu>
+#include <QMouseEvent>
+#include <QPainter>
 #include <QTabWidget>
 #include <QTableView>
 #include <QTimer>
@@ -73,6 +80,80 @@ bool SaveLoad(MainWindow &window, QTabWidget &tabs, const QDir &output) {
   return Save(window, output, "load-summary.png") && saved;
 }
 
+void WriteFile(const std::filesystem::path &path, const std::string &bytes) {
+  std::filesystem::create_directories(path.parent_path());
+  std::ofstream(path, std::ios::binary) << bytes;
+}
+
+// A folder whose files stand in every state the files dialog shows, and three setups.
+void MakeSetupsExample(const std::filesystem::path &game) {
+  const std::filesystem::path library = game / "ZEP128";
+  WriteFile(game / "bases.dat", "the game's own bases");
+  for (const char *file : {"sky.spt", "horizon.spt", "bases.dat", "dusk.pal", "Dusk Patrol.msn"})
+    WriteFile(library / "G-Dusk Sky" / file, file);
+  const std::filesystem::path setups = library / "#Selector" / "setups";
+  WriteFile(setups / "Evening flying.txt", "G-Dusk Sky\r\nH-Evening Haze\r\nN-Engine Hum\r\n");
+  WriteFile(setups / "Channel Summer campaign.txt",
+            "C-Channel Summer\r\nS-Autumn Camouflage\r\nN-Gun Bursts\r\n");
+  WriteFile(setups / "Before Reset All.txt", "U-Grass Airfields\r\nR-Thin Cirrus\r\n");
+}
+
+QModelIndex RowNamed(QTableView *grid, const char *name) {
+  const QModelIndexList found =
+      grid->model()->match(grid->model()->index(0, 1), Qt::DisplayRole, name, 1, Qt::MatchExactly);
+  return found.isEmpty() ? QModelIndex() : found.front();
+}
+
+// Adds the example and refreshes the grid, loads two of its folders, opens the grid's menu on one
+// with its "Switch to setup" entry open and grabs the window with both menus over it; then opens
+// that folder's files and grabs the dialog.
+bool SaveSetupPictures(MainWindow &window, const QDir &output) {
+  const std::filesystem::path game = ToPath(window.findChild<QLabel *>("EAWDirLabel")->text());
+  MakeSetupsExample(game);
+  QMouseEvent refresh(QEvent::MouseButtonRelease, QPointF(5, 5), QPointF(5, 5), Qt::LeftButton,
+                      Qt::NoButton, Qt::NoModifier);
+  QApplication::sendEvent(window.findChild<QLabel *>("Label33"), &refresh);
+  auto *grid = window.findChild<QTableView *>("Unigrid");
+  for (const char *name : {"G-Dusk Sky", "H-Evening Haze"})
+    emit grid->clicked(RowNamed(grid, name));
+  std::filesystem::remove(game / "dusk.pal");
+  Settle();
+  const QModelIndex row = RowNamed(grid, "G-Dusk Sky");
+  grid->scrollTo(row);
+  const QPoint at = grid->visualRect(row).center();
+  QContextMenuEvent click(QContextMenuEvent::Mouse, at, grid->viewport()->mapToGlobal(at));
+  QApplication::sendEvent(grid->viewport(), &click);
+  auto *menu = window.findChild<QMenu *>("FolderGridMenu");
+  if (menu == nullptr)
+    return false;
+  Settle();
+  QMenu *setups = nullptr;
+  for (QAction *action : menu->actions())
+    if (action->text() == "Switch to setup") {
+      menu->setActiveAction(action);
+      setups = action->menu();
+    }
+  if (setups == nullptr)
+    return false;
+  setups->popup(menu->geometry().topRight() +
+                QPoint(0, menu->actionGeometry(menu->activeAction()).y()));
+  Settle();
+  QPixmap picture = window.grab();
+  QPainter painter(&picture);
+  for (QMenu *shown : {menu, setups})
+    painter.drawPixmap(window.mapFromGlobal(shown->pos()), shown->grab());
+  painter.end();
+  const QString path = output.filePath("context-menu.png");
+  if (!picture.save(path, "PNG"))
+    return false;
+  std::cout << "take_screenshots: saved " << path.toStdString() << "\n";
+  menu->actions().front()->trigger();
+  menu->close();
+  Settle();
+  auto *dialog = window.findChild<QDialog *>("FolderFilesDialog");
+  return dialog != nullptr && Save(*dialog, output, "files-dialog.png");
+}
+
 } // namespace
 
 int main(int argc, char *argv[]) {
@@ -95,5 +176,6 @@ int main(int argc, char *argv[]) {
   for (const Page &page : kPages)
     saved = SavePage(window, *tabs, page, output) && saved;
   saved = SaveLoad(window, *tabs, output) && saved;
+  saved = SaveSetupPictures(window, output) && saved;
   return saved ? 0 : 1;
 }

@@ -52,7 +52,8 @@ protected:
 TEST_F(Keeping, AnUnloadPutsBackTheFileOfTheFolderLoadedLast) {
   EXPECT_EQ(Click("N-A"), "");
   EXPECT_EQ(Click("N-B"), "\"N-B\" replaced files of \"N-A\", which stay loaded. Unloading "
-                          "\"N-B\" puts their files back.");
+                          "\"N-B\" puts their files back.\nbases.dat, \"N-A\"'s copy\n"
+                          "sky.spt, \"N-A\"'s copy");
   EXPECT_NE(Click("N-C").find("replaced files of \"N-B\", which"), std::string::npos);
   EXPECT_EQ(game.Read("sky.spt"), "N-C");
   Click("N-C");

@@ -74,3 +74,17 @@ TEST_F(Links, LinkedFilesAreRefusedAndWhatTheyPointAtStaysAsItWas) {
   EXPECT_NE(failures.Lines()[0].find("linked.dat"), std::string::npos);
   EXPECT_NE(failures.Lines()[0].find("link"), std::string::npos);
 }
+
+TEST_F(Links, LinkedSetupsAreNeitherReadNorWrittenNorDeleted) {
+  fs::create_directories(game.Path() / "ZEP128/#Selector/setups");
+  ASSERT_TRUE(Plant("ZEP128/#Selector/setups/linked.txt"));
+  EXPECT_EQ(selector.SwitchToSetup("linked", failures), "");
+  EXPECT_NE(failures.HeadingOr("").find("it is a link"), std::string::npos);
+  fs::remove_all(game.Path() / "ZEP128/#Selector/setups");
+  fs::create_directory_symlink(outside.Path(), game.Path() / "ZEP128/#Selector/setups");
+  EXPECT_EQ(selector.Setups(), std::vector<std::string>{});
+  EXPECT_FALSE(selector.SaveSetup("target", failures));
+  EXPECT_FALSE(selector.DeleteSetup("target", failures));
+  EXPECT_EQ(selector.SwitchToSetup("target", failures), "");
+  ExpectOutsideUntouched();
+}

@@ -47,7 +47,8 @@ TEST(StartupWindow, WindowHasItsCaptionControlsAndPages) {
   EXPECT_EQ(driver.Find<QPushButton>("IniEdit")->text(),
             "Display \"eaw.ini' for inspection or further editing");
   EXPECT_EQ(driver.Find<QLabel>("Label22")->text(),
-            "Click on a white row to load a folder, or click on a green row to unload it.");
+            "Click on a white row to load a folder, or click on a green row to unload it. "
+            "Right-click a row for setups and the folder's files.");
   EXPECT_FALSE(driver.Find<QWidget>("Frame21")->isVisible());
   EXPECT_EQ(driver.Find<QLineEdit>("Text4")->text(), "0");
   EXPECT_TRUE(driver.Grid()->isColumnHidden(0));

@@ -91,7 +91,9 @@ TEST(ViewsWindow, ResetAllAsksThenDeletesAddOnFilesAndUnmarksEveryRow) {
   EXPECT_EQ(driver.AnswerNextBox(QMessageBox::Cancel,
                                  [&] { QTest::mouseClick(resetAll, Qt::LeftButton); }),
             "Reset All will delete 3 files from the game folder, and put back the game's own "
-            "files that add-ons replaced:\npic1.bmp\nplanes.dat\nreadme.txt");
+            "files that add-ons replaced. The loaded folders are saved first as the setup \"Before "
+            "Reset All\": switching to it (right-click the folder grid) loads them again. The "
+            "files:\npic1.bmp\nplanes.dat\nreadme.txt");
   EXPECT_TRUE(game.Exists("readme.txt"));
   EXPECT_EQ(driver.Grid()->model()->index(0, 2).data().toString(), "S");
   driver.AnswerNextBox(QMessageBox::Ok, [&] { QTest::mouseClick(resetAll, Qt::LeftButton); });

@@ -53,7 +53,15 @@ void ShowFailures(QWidget *parent, const Failures &failures, const QString &head
 void ShowNotice(QWidget *parent, const std::string &notice) {
   if (notice.empty())
     return;
-  QMessageBox *box = ListBox(parent, QMessageBox::Information, notice, {}, QMessageBox::Ok);
+  const size_t end = notice.find('\n');
+  std::vector<std::string> lines;
+  for (size_t start = end; start != std::string::npos;) {
+    const size_t next = notice.find('\n', start + 1);
+    lines.push_back(notice.substr(start + 1, next - start - 1));
+    start = next;
+  }
+  QMessageBox *box =
+      ListBox(parent, QMessageBox::Information, notice.substr(0, end), lines, QMessageBox::Ok);
   box->setAttribute(Qt::WA_DeleteOnClose);
   box->open();
 }
@@ -62,7 +70,9 @@ bool ConfirmDeletion(QWidget *parent, const std::vector<std::string> &names) {
   const std::string heading = "Reset All will delete " + std::to_string(names.size()) +
                               (names.size() == 1 ? " file" : " files") +
                               " from the game folder, and put back the game's own files that "
-                              "add-ons replaced:";
+                              "add-ons replaced. The loaded folders are saved first as the setup "
+                              "\"Before Reset All\": switching to it (right-click the folder grid) "
+                              "loads them again. The files:";
   QMessageBox *box =
       ListBox(parent, QMessageBox::Question, heading, names, QMessageBox::Ok | QMessageBox::Cancel);
   box->setObjectName("ConfirmResetAll");

@@ -7,6 +7,7 @@
 #include "ui/folder_grid_model.h"
 #include "ui/input_blocker.h"
 #include "ui/picture.h"
+#include "ui/setup_menu.h"
 #include "ui/slot_grid_view.h"
 #include "ui/twips.h"
 #include "ui/window_icon.h"
@@ -33,6 +34,10 @@ MainWindow::MainWindow(const fs::path &eawDir)
   WireHooks();
   summaryShown_.setSingleShot(true);
   connect(&summaryShown_, &QTimer::timeout, this, [this] { c_.Label22->setText(kInstructions); });
+  connect(new SetupMenu(selector_, c_.Unigrid, this), &SetupMenu::Changed, this, [this] {
+    ShowSummary();
+    ShowGridChanges();
+  });
 }
 
 // The widgets outlive the state they show by a moment: detach the grid from it first.

@@ -44,7 +44,8 @@ struct Controls {
 
 // The instructions above the category list, which a summary line replaces for a while.
 inline constexpr char kInstructions[] =
-    "Click on a white row to load a folder, or click on a green row to unload it.";
+    "Click on a white row to load a folder, or click on a green row to unload it. Right-click a "
+    "row for setups and the folder's files.";
 
 // The slot panel's colour, also the colour of the slot grid's header cells.
 inline constexpr char kSlotFrameColour[] = "#E0E0E0";
