@@ -2,6 +2,7 @@
 
 #include "base/names.h"
 #include "base/new_file.h"
+#include "base/step_seam.h"
 #include "base/text_file.h"
 
 #include <cstdio>
@@ -124,6 +125,7 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
   if (attributes != INVALID_FILE_ATTRIBUTES)
     SetFileAttributesW(target.c_str(), attributes & ~DWORD{FILE_ATTRIBUTE_READONLY});
 #endif
+  StepDone();
   return true;
 }
 
@@ -157,6 +159,7 @@ static bool CopyOver(const fs::path &source, const fs::path &target, Failures &f
     RemovePartial(temporary);
     return false;
   }
+  StepDone();
   return true;
 }
 
@@ -185,6 +188,7 @@ bool CopyJournaled(const fs::path &source, const fs::path &target, Failures &fai
     return false;
   }
   MakeBothNormal(source, target, failures);
+  StepDone();
   return true;
 }
 
@@ -206,8 +210,10 @@ bool RemoveFile(const fs::path &path, Failures &failures, const std::string &pro
 #endif
   std::error_code error;
   fs::remove(path, error);
-  if (!error)
+  if (!error) {
+    StepDone();
     return true;
+  }
 #ifdef _WIN32
   if (restore != INVALID_FILE_ATTRIBUTES)
     SetFileAttributesW(path.c_str(), restore);

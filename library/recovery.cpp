@@ -17,7 +17,7 @@ static void TakeOut(LibraryState &state, const Journal &journal, Caption &captio
   const fs::path keeping = KeepingFolder(state.LibDir);
   Ledger ledger = Ledger::Read(keeping, failures);
   ledger.Remove(journal.folder);
-  UnplaceFiles(state, ledger, journal.entries, true, caption, failures);
+  ledger.AddLeftovers(UnplaceFiles(state, ledger, journal.entries, true, caption, failures));
   // A save file carried home into a campaign folder may have been half copied.
   const fs::path folder = Child(state.LibDir, journal.folder);
   for (const std::string &name : ListFiles(folder, "*.partial"))
@@ -44,7 +44,7 @@ void FinishInterrupted(LibraryState &state, Caption &caption, Failures &failures
     break;
   case Journal::Step::Reset:
   case Journal::Step::Restore:
-    FinishReset(state, std::move(*journal), caption, failures);
+    FinishReset(state, std::move(*journal), true, caption, failures);
     break;
   }
   Journal::Remove(keeping);

@@ -58,11 +58,18 @@ void ShowNotice(QWidget *parent, const std::string &notice) {
   box->open();
 }
 
-bool ConfirmDeletion(QWidget *parent, const std::vector<std::string> &names) {
-  const std::string heading = "Reset All will delete " + std::to_string(names.size()) +
-                              (names.size() == 1 ? " file" : " files") +
-                              " from the game folder, and put back the game's own files that "
-                              "add-ons replaced:";
+// "3 files", "1 file".
+static std::string Files(size_t count) {
+  return std::to_string(count) + (count == 1 ? " file" : " files");
+}
+
+bool ConfirmDeletion(QWidget *parent, int loadedFiles, const std::vector<std::string> &names) {
+  std::string heading = "Reset All will unload every loaded folder, taking out the " +
+                        Files(static_cast<size_t>(loadedFiles)) +
+                        " they put into the game and putting back the game's own files that "
+                        "they replaced";
+  heading +=
+      names.empty() ? "." : ", and delete " + Files(names.size()) + " more from the game folder:";
   QMessageBox *box =
       ListBox(parent, QMessageBox::Question, heading, names, QMessageBox::Ok | QMessageBox::Cancel);
   box->setObjectName("ConfirmResetAll");
