@@ -1,5 +1,6 @@
 #include "app/selector.h"
 #include "base/names.h"
+#include "base/step_seam.h"
 #include "library/keeping.h"
 #include "tests/game_folder.h"
 
@@ -160,4 +161,86 @@ TEST_F(Keeping, AFolderGoneFromTheLibraryOrPartlyLoadedIsSaidSo) {
   EXPECT_EQ(Mark("N-B"), "S");
   EXPECT_EQ(partly.Lines().size(), 1u);
   EXPECT_EQ(partly.HeadingOr("").find("\"N-B\" is only partly loaded"), 0u);
+}
+
+TEST_F(Keeping, ACopyThatFailsAfterItsOriginalWasKeptPutsTheOriginalBackAtOnce) {
+  // The source goes (held by another program, a failing disk) just after the original was kept.
+  SetStepHook([&] {
+    if (game.Exists("ZEP128/#Selector/originals/G/bases.dat"))
+      fs::remove(game.Path() / "ZEP128/N-A/bases.dat");
+  });
+  Click("N-A");
+  SetStepHook({});
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+  EXPECT_NE(failures.Message("").find("bases.dat: is the game's own file again"), std::string::npos)
+      << failures.Message("");
+  Click("N-A");
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+}
+
+TEST_F(Keeping, ACopyThatCannotBeDeletedStaysListedIsTriedAgainAndIsNoOriginal) {
+  for (int time = 0; time < 2; ++time) {
+    Click("N-C");
+    // The game holds sky.spt open; here something that cannot be deleted takes its place.
+    fs::remove(game.Path() / "sky.spt");
+    game.Write("sky.spt/held");
+    Failures held;
+    selector->ClickRow(RowOf(selector->State().Unigrid, "N-C"), held);
+    EXPECT_NE(held.Message("").find("sky.spt"), std::string::npos);
+    fs::remove_all(game.Path() / "sky.spt");
+    game.Write("sky.spt", "N-C"); // released
+    if (time == 0) {
+      Click("N-B"); // a load over it must not keep it as the game's own file
+      Click("N-B");
+    } else {
+      Restart();
+    }
+    EXPECT_FALSE(game.Exists("sky.spt")) << time;
+  }
+}
+
+TEST_F(Keeping, AnOldRecordGivesTheLedgerOnceAndTheLedgerWinsAtEveryStart) {
+  game.Addon("S-X", {"x.dat"});
+  game.Addon("S-Y", {"y.dat"});
+  for (const char *copy : {"x.dat", "y.dat"})
+    game.Write(copy, copy);
+  game.Write("sky.spt", "N-A");
+  game.WithRecord("N-A\r\nS-X\r\nS-Y\r\n\r\n");
+  Restart();
+  ASSERT_EQ(failures.Lines().size(), 1u);
+  EXPECT_NE(failures.Lines()[0].find("earlier version"), std::string::npos);
+  // Two folders of a one-per-category letter have copies in the game: both show loaded.
+  EXPECT_EQ(Mark("N-A") + Mark("S-X") + Mark("S-Y"), "SSS");
+  Restart();
+  EXPECT_EQ(failures.Lines().size(), 1u);
+  Click("S-X");
+  Click("S-Y");
+  EXPECT_FALSE(game.Exists("x.dat") || game.Exists("y.dat"));
+
+  game.WithRecord("N-B\r\n\r\n");
+  Restart();
+  EXPECT_EQ(Mark("N-A") + "|" + Mark("N-B"), "S|");
+  EXPECT_NE(failures.Lines().back().find("\"N-A\" is loaded. \"N-B\" is not loaded."),
+            std::string::npos);
+  Click("N-A");
+  EXPECT_FALSE(game.Exists("sky.spt"));
+}
+
+TEST_F(Keeping, ResetAllUnloadsEveryFolderInEveryPlaceThenDeletesTheOtherMatches) {
+  game.Write("ZEP128/N-A/notes.xyz", "matches no pattern");
+  game.Write("ZEP128/N-A/tune.bgm", "A tune");
+  Click("N-A");
+  Click("N-B");
+  game.Write("readme.txt", "another match");
+  EXPECT_EQ(selector->ResetAllFiles(failures), std::vector<std::string>{"readme.txt"});
+  EXPECT_EQ(selector->ResetAllLoadedFiles(failures), 5);
+  selector->ResetAll({"readme.txt"}, failures);
+  for (const char *gone : {"notes.xyz", "Music/tune.bgm", "sky.spt", "readme.txt"})
+    EXPECT_FALSE(game.Exists(gone)) << gone;
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+  EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
+  Click("N-A"); // a load and an unload after a Reset All
+  Click("N-A");
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+  EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }

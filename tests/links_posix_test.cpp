@@ -74,3 +74,12 @@ TEST_F(Links, LinkedFilesAreRefusedAndWhatTheyPointAtStaysAsItWas) {
   EXPECT_NE(failures.Lines()[0].find("linked.dat"), std::string::npos);
   EXPECT_NE(failures.Lines()[0].find("link"), std::string::npos);
 }
+
+TEST_F(Links, APlaceForTheGamesOwnFileTakenByALinkLoopLeavesThatFileAlone) {
+  game.Write("planes.dat", "own");
+  game.MakeFolder("ZEP128/#Selector/originals/G");
+  fs::create_symlink("planes.dat", game.Path() / "ZEP128/#Selector/originals/G/planes.dat");
+  selector.ClickRow(1, failures);
+  EXPECT_EQ(game.Read("planes.dat"), "own");
+  EXPECT_NE(failures.Message("").find("planes.dat"), std::string::npos);
+}
