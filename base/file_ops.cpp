@@ -12,6 +12,9 @@
 
 #ifdef _WIN32
 #include <windows.h>
+#else
+#include <fcntl.h>
+#include <unistd.h>
 #endif
 
 namespace fs = std::filesystem;
@@ -65,6 +68,26 @@ fs::path PartialPath(const fs::path &target) {
   return Child(target.parent_path(), name + ".partial");
 }
 
+void FlushFolder([[maybe_unused]] const fs::path &folder) {
+#ifndef _WIN32
+  const int descriptor = ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+  if (descriptor >= 0) {
+    ::fsync(descriptor);
+    ::close(descriptor);
+  }
+#endif
+}
+
+void FlushFileSystem([[maybe_unused]] const fs::path &folder) {
+#ifndef _WIN32
+  const int descriptor = ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+  if (descriptor >= 0) {
+    ::syncfs(descriptor);
+    ::close(descriptor);
+  }
+#endif
+}
+
 void RemovePartial(const fs::path &partial) {
   std::error_code error;
   // A link of that name is removed itself, never what it points to.
@@ -76,6 +99,22 @@ void RemovePartial(const fs::path &partial) {
   SetFileAttributesW(partial.c_str(), FILE_ATTRIBUTE_NORMAL);
 #endif
   fs::remove(partial, error);
+}
+
+// Renames `from` over `to` and waits until the rename is on the disk, so that a power cut
+// leaves the old file or the new one in place, never an empty one.
+static std::error_code RenameDurably(const fs::path &from, const fs::path &to) {
+#ifdef _WIN32
+  if (MoveFileExW(from.c_str(), to.c_str(), MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH))
+    return {};
+  return std::error_code(static_cast<int>(GetLastError()), std::system_category());
+#else
+  std::error_code error;
+  fs::rename(from, to, error);
+  if (!error)
+    FlushFolder(to.parent_path());
+  return error;
+#endif
 }
 
 static std::optional<fs::perms> PermissionsOf(const fs::path &path) {
@@ -110,7 +149,7 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
     RemovePartial(temporary);
     return false;
   }
-  fs::rename(temporary, target, error);
+  error = RenameDurably(temporary, target);
   if (error) {
     failures.Add(target, "cannot be replaced (" + error.message() + ")");
     RemovePartial(temporary);

@@ -177,8 +177,12 @@ bool Journal::Write(const fs::path &keeping, Failures &failures) const {
 }
 
 void Journal::Remove(const fs::path &keeping) {
+  // The journal goes only once what it covers is on the disk, so that a power cut cannot leave
+  // half-written copies with no journal to clear them away.
+  FlushFileSystem(keeping);
   std::error_code error;
   fs::remove(keeping / kJournalFile, error);
+  FlushFolder(keeping);
 }
 
 bool MoveReplacing(const fs::path &from, const fs::path &to, Failures &failures) {

@@ -79,6 +79,7 @@ struct Journal {
   // file left by an interrupted write of it is removed.
   static std::optional<Journal> Read(const std::filesystem::path &keeping, Failures &failures);
   bool Write(const std::filesystem::path &keeping, Failures &failures) const;
+  // Closes the journal once everything the operation wrote is on the disk.
   static void Remove(const std::filesystem::path &keeping);
 };
 

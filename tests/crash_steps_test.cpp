@@ -7,6 +7,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdlib>
 #include <functional>
 #include <map>
 #include <memory>
@@ -62,6 +63,24 @@ std::function<void(Selector &, Failures &)> Clicks(const std::string &folder) {
 
 class CrashSteps : public ::testing::TestWithParam<Operation> {
 protected:
+#ifndef _WIN32
+  // Hundreds of operations, each flushed to the disk: on a memory file system where there is
+  // one, so that the flushes cost nothing.
+  void SetUp() override {
+    if (const char *old = std::getenv("TMPDIR"))
+      oldTemporary = old;
+    std::error_code error;
+    if (fs::is_directory("/dev/shm", error))
+      ::setenv("TMPDIR", "/dev/shm", 1);
+  }
+  void TearDown() override {
+    if (oldTemporary.empty())
+      ::unsetenv("TMPDIR");
+    else
+      ::setenv("TMPDIR", oldTemporary.c_str(), 1);
+  }
+  std::string oldTemporary;
+#endif
   // A fresh game with the folders `before` loaded; true when the operation was killed at `step`
   // (0 for none) and the recovery then at `recoveryStep`.
   bool KillAt(int step, int recoveryStep) {

@@ -191,6 +191,8 @@ TEST_F(Keeping, ACopyThatCannotBeDeletedStaysListedIsTriedAgainAndIsNoOriginal) 
     game.Write("sky.spt", "N-C"); // released
     if (time == 0) {
       Click("N-B"); // a load over it must not keep it as the game's own file
+      Restart();    // nor may a start take the loaded copy for the leftover
+      EXPECT_EQ(game.Read("sky.spt"), "N-B");
       Click("N-B");
     } else {
       Restart();
