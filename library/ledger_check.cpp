@@ -10,6 +10,7 @@
 #include "library/game_places.h"
 #include "library/keeping.h"
 #include "library/loaded_record.h"
+#include "library/save_files.h"
 #include "library/unplace.h"
 
 #include <algorithm>
@@ -103,6 +104,10 @@ void MendRecordFromLedger(LibraryState &state, Caption &caption, Failures &failu
     return;
   }
   Ledger ledger = Ledger::Read(keeping, failures);
+  // A Reset All cut short while it carried a campaign's saved games home has no journal yet.
+  for (const LoadedFolder &folder : ledger.Folders())
+    if (IsCampaignFolder(Child(state.LibDir, folder.name)))
+      RemoveHalfCarried(Child(state.LibDir, folder.name));
   if (RetryLeftovers(state, ledger, caption, failures))
     ledger.Write(keeping, failures);
   FollowLedger(state, ledger, recorded, failures);

@@ -69,7 +69,15 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
                                  " is taken by something that is no file");
         continue;
       }
-      keep = !*kept;
+      // Two files would claim to be the game's own (a saved game played on after an older one
+      // was kept): neither may be lost.
+      if (*kept) {
+        failures.Add(source, "not copied: the game's own file of that name is kept in " +
+                                 DisplayPath(OriginalsFolder(keeping, place)) +
+                                 " already, and the game holds another one that would be lost");
+        continue;
+      }
+      keep = true;
     }
     copies.push_back({source, {target, keep}});
   }

@@ -1,11 +1,11 @@
 #include "library/recovery.h"
 
 #include "base/file_ops.h"
-#include "base/listing.h"
 #include "base/names.h"
 #include "library/keeping.h"
 #include "library/loaded_record.h"
 #include "library/reset_all.h"
+#include "library/save_files.h"
 #include "library/unplace.h"
 
 namespace fs = std::filesystem;
@@ -18,10 +18,7 @@ static void TakeOut(LibraryState &state, const Journal &journal, Caption &captio
   Ledger ledger = Ledger::Read(keeping, failures);
   ledger.Remove(journal.folder);
   ledger.AddLeftovers(UnplaceFiles(state, ledger, journal.entries, true, caption, failures));
-  // A save file carried home into a campaign folder may have been half copied.
-  const fs::path folder = Child(state.LibDir, journal.folder);
-  for (const std::string &name : ListFiles(folder, "*.partial"))
-    RemovePartial(Child(folder, name));
+  RemoveHalfCarried(Child(state.LibDir, journal.folder));
   ledger.Write(keeping, failures);
   SetRecorded(state, journal.folder, false, failures);
 }

@@ -3,7 +3,7 @@
 //   click NAME       start-up, then a click on the folder row NAME (load or unload)
 //   reset            start-up, then Reset All of every file it lists
 //   music            start-up, then a switch to the first music set listed
-//   ini              start-up, then eaw.ini saved from the editor's text unchanged
+//   ini              start-up, then eaw.ini saved from the editor with the same text each time
 //   manifest FILE    notes the player's files (game folder and Savedata) and their checksums
 //   check FILE       prints each damage found and exits 1 when there is any
 #include "app/selector.h"
@@ -161,7 +161,7 @@ int main(int argc, char **argv) {
   } else if (step == "reset") {
     selector.ResetAll(selector.ResetAllFiles(failures), failures);
   } else if (step == "ini") {
-    selector.SaveSettingsFile(selector.SettingsFileText(failures), failures);
+    selector.SaveSettingsFile("[Main]\r\nWidth=800", failures);
   } else if (step == "music") {
     const MusicList music = selector.MusicSets(failures);
     if (music.current && !music.entries.empty())

@@ -64,8 +64,9 @@ operations=(
 killed_at() {
   local call="$1" n="$2"
   shift 2
-  ! strace -f -qq -o /dev/null -e trace="$call" -e inject="$call:signal=KILL:when=$n" \
-    "$driver" "$game" "$@" >/dev/null 2>&1
+  # In a subshell, so that the shell does not announce each kill.
+  ! (strace -f -qq -o /dev/null -e trace="$call" -e inject="$call:signal=KILL:when=$n" \
+    "$driver" "$game" "$@") >/dev/null 2>&1
 }
 
 # Starts the program (the recovery) and checks; counts and prints damage.

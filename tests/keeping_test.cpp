@@ -123,7 +123,8 @@ TEST_F(Keeping, TheNextStartRollsAnInterruptedLoadBack) {
 TEST_F(Keeping, TheNextStartFinishesAnInterruptedUnloadResetAndMusicSwitch) {
   Click("N-A");
   // Killed during the unload of N-A, before anything was taken out.
-  game.Write("ZEP128/#Selector/journal.txt", "unload\r\nN-A\r\n\tG-bases.dat\r\n\tG-sky.spt\r\n");
+  game.Write("ZEP128/#Selector/journal.txt",
+             "unload\r\nN-A\r\n\tG+bases.dat\r\n\tG-sky.spt\r\n\tS+a.msn\r\n");
   Restart();
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
   EXPECT_FALSE(game.Exists("sky.spt"));
@@ -245,4 +246,16 @@ TEST_F(Keeping, ResetAllUnloadsEveryFolderInEveryPlaceThenDeletesTheOtherMatches
   Click("N-A");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
+}
+
+TEST_F(Keeping, AKeptOriginalIsNeverOverwrittenAndAFolderThatLeftTheLibraryStillUnloads) {
+  game.Write("ZEP128/#Selector/originals/G/bases.dat", "kept before");
+  Click("N-A");
+  EXPECT_EQ(game.Read("bases.dat"), kOriginal);
+  EXPECT_EQ(game.Read("ZEP128/#Selector/originals/G/bases.dat"), "kept before");
+  EXPECT_NE(failures.Message("").find("bases.dat: not copied"), std::string::npos);
+  fs::remove_all(game.Path() / "ZEP128/N-A");
+  Click("N-A");
+  EXPECT_FALSE(game.Exists("sky.spt"));
+  EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
 }

@@ -64,12 +64,14 @@ static std::string Files(size_t count) {
 }
 
 bool ConfirmDeletion(QWidget *parent, int loadedFiles, const std::vector<std::string> &names) {
-  std::string heading = "Reset All will unload every loaded folder, taking out the " +
-                        Files(static_cast<size_t>(loadedFiles)) +
-                        " they put into the game and putting back the game's own files that "
-                        "they replaced";
-  heading +=
-      names.empty() ? "." : ", and delete " + Files(names.size()) + " more from the game folder:";
+  std::string heading =
+      loadedFiles > 0
+          ? "Reset All will unload every loaded folder: it takes out the " +
+                Files(static_cast<size_t>(loadedFiles)) +
+                " they put into the game and puts back the game's own files they replaced."
+          : "Reset All will put back the game's own files that add-ons replaced.";
+  if (!names.empty())
+    heading += " It also deletes these " + Files(names.size()) + " from the game folder:";
   QMessageBox *box =
       ListBox(parent, QMessageBox::Question, heading, names, QMessageBox::Ok | QMessageBox::Cancel);
   box->setObjectName("ConfirmResetAll");
