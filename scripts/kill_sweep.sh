@@ -66,7 +66,8 @@ killed_at() {
   shift 2
   # In a subshell, so that the shell does not announce each kill.
   ! (strace -f -qq -o /dev/null -e trace="$call" -e inject="$call:signal=KILL:when=$n" \
-    "$driver" "$game" "$@") >/dev/null 2>&1
+    "$driver" "$game" "$@"
+    exit $?) >/dev/null 2>&1
 }
 
 # Starts the program (the recovery) and checks; counts and prints damage.
