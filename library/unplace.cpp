@@ -30,14 +30,11 @@ std::vector<Journal::Entry> TakeOutEntries(const std::vector<PlacedFile> &files,
   return entries;
 }
 
-// Whether a file of that name is still in `folder`, without following a link; a folder in the
-// way is no copy to try again.
+// Whether an entry of that name is still in `folder`, without following a link.
 static bool StillThere(const fs::path &folder, const std::string &name) {
   std::error_code error;
-  const fs::file_status status = fs::symlink_status(Child(folder, name), error);
-  return fs::exists(status) && !fs::is_directory(status);
+  return fs::exists(fs::symlink_status(Child(folder, name), error));
 }
-
 std::vector<FileStep> UnplaceFiles(LibraryState &state, const Ledger &ledger,
                                    const std::vector<Journal::Entry> &entries, bool afterCrash,
                                    Caption &caption, Failures &failures) {
