@@ -41,10 +41,13 @@ Ledger LedgerFromRecord(const LibraryState &state, const std::vector<std::string
   Ledger ledger;
   std::set<std::string> seen;
   for (const std::string &line : recorded) {
-    FolderCheck(Child(state.LibDir, line));
     // A record written in Windows-1252 names the folders that UTF-8 names differently.
-    const std::string name = FolderFound ? line : TextAsUtf8(line);
+    std::string name = NameFromText(line);
     FolderCheck(Child(state.LibDir, name));
+    if (!FolderFound) {
+      name = TextAsUtf8(line);
+      FolderCheck(Child(state.LibDir, name));
+    }
     if (FolderFound && seen.insert(name).second)
       ledger.Append(FoundCopies(state.EAWDir, Child(state.LibDir, name)));
   }

@@ -33,7 +33,7 @@ random_file() { head -c "${2:-3000}" /dev/urandom >"$1"; }
 
 mkdir -p "$template/Savedata" "$template/Music" "$template/Set1" "$template/ZEP128"
 printf 'Sounds: N\r\nSkins: S\r\nCampaigns: C\r\n' >"$template/ZEP128/zep.ini"
-printf 'Set1\r\n' >"$template/Music.ini"
+printf 'Set0\r\nSet1\r\n' >"$template/Music.ini"
 printf '[Main]\r\nWidth=800\r\n' >"$template/eaw.ini"
 mkdir -p "$template"/ZEP128/{N-A,N-B,S-X,S-Y,C-War}
 for file in N-A/game.cfg N-A/mission.msn N-A/a1.dat N-A/sky.spt N-B/sky.spt N-B/b1.dat \

@@ -180,6 +180,10 @@ TEST_F(Keeping, ACopyThatFailsAfterItsOriginalWasKeptPutsTheOriginalBackAtOnce) 
 }
 
 TEST_F(Keeping, ACopyThatCannotBeDeletedStaysListedIsTriedAgainAndIsNoOriginal) {
+#ifdef _WIN32
+  GTEST_SKIP() << "a folder in a file's way behaves otherwise under Wine; the Windows tests hold "
+                  "the copy open instead";
+#endif
   for (int time = 0; time < 2; ++time) {
     Click("N-C");
     // The game holds sky.spt open; here something that cannot be deleted takes its place.
