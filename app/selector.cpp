@@ -6,6 +6,7 @@
 #include "library/category_view.h"
 #include "library/grid_click.h"
 #include "library/keeping.h"
+#include "library/ledger_check.h"
 #include "library/loaded_record.h"
 #include "library/record_replay.h"
 #include "library/recovery.h"
@@ -32,6 +33,7 @@ void Selector::StartUp(Failures &failures) {
   const std::vector<SkippedLine> skipped = PrepareLibrary(state_, failures);
   BuildGrid(state_, state_.Codes);
   EnsureRecord(state_, failures);
+  MendRecordFromLedger(state_, caption_, failures);
   ReplayRecord(state_, caption_, failures);
   state_.BackPic = GamePicture(state_.EAWDir, "background");
   state_.NewPic = GamePicture(state_.EAWDir, "newpic");
@@ -119,6 +121,10 @@ void Selector::RefreshLibrary(Failures &failures) {
 
 std::vector<std::string> Selector::ResetAllFiles(Failures &failures) const {
   return CleanUpNames(state_, failures);
+}
+
+int Selector::ResetAllLoadedFiles(Failures &failures) const {
+  return LoadedFileCount(state_, failures);
 }
 
 void Selector::ResetAll(const std::vector<std::string> &names, Failures &failures) {

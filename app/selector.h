@@ -24,8 +24,9 @@ public:
   const SelectorState &State() const { return state_; }
 
   // Finishes or rolls back what a crash interrupted, creates the library's files when missing,
-  // reads the categories, builds the grid, marks the recorded folders loaded without touching a
-  // file, finds the pictures and shows every folder.
+  // reads the categories, builds the grid, mends the record where the ledger says otherwise,
+  // marks the recorded folders loaded without touching a file, finds the pictures and shows
+  // every folder.
   void StartUp(Failures &failures);
   // Shows category list entry `entry`; returns the text of the code-letter label.
   std::string ShowCategory(int entry);
@@ -41,10 +42,13 @@ public:
   }
   // Rebuilds the grid from the library on disk, keeping the loaded marks.
   void RefreshLibrary(Failures &failures);
-  // The game-folder files that Reset All would delete, for the player to agree to.
+  // The game-folder files that Reset All would delete besides the loaded folders' copies, for the
+  // player to agree to.
   std::vector<std::string> ResetAllFiles(Failures &failures) const;
-  // Deletes the add-on files `names` from the game folder, puts the kept originals back and
-  // empties the record.
+  // How many files of loaded folders Reset All would take out.
+  int ResetAllLoadedFiles(Failures &failures) const;
+  // Unloads every loaded folder, deletes the add-on files `names` from the game folder, puts the
+  // kept originals back and empties the record.
   void ResetAll(const std::vector<std::string> &names, Failures &failures);
   // The preview of grid row `row` when the pointer has entered it; nothing when it was already
   // over that row.

@@ -3,6 +3,7 @@
 #include "base/links.h"
 #include "base/names.h"
 #include "base/new_file.h"
+#include "base/step_seam.h"
 #include "base/text_file.h"
 
 #include <cstdio>
@@ -12,6 +13,9 @@
 
 #ifdef _WIN32
 #include <windows.h>
+#else
+#include <fcntl.h>
+#include <unistd.h>
 #endif
 
 namespace fs = std::filesystem;
@@ -72,6 +76,26 @@ fs::path PartialPath(const fs::path &target) {
   return Child(target.parent_path(), name + ".partial");
 }
 
+void FlushFolder([[maybe_unused]] const fs::path &folder) {
+#ifndef _WIN32
+  const int descriptor = ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+  if (descriptor >= 0) {
+    ::fsync(descriptor);
+    ::close(descriptor);
+  }
+#endif
+}
+
+void FlushFileSystem([[maybe_unused]] const fs::path &folder) {
+#ifndef _WIN32
+  const int descriptor = ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+  if (descriptor >= 0) {
+    ::syncfs(descriptor);
+    ::close(descriptor);
+  }
+#endif
+}
+
 void RemovePartial(const fs::path &partial) {
   std::error_code error;
   // A link of that name is removed itself, never what it points to.
@@ -84,6 +108,22 @@ void RemovePartial(const fs::path &partial) {
     SetFileAttributesW(partial.c_str(), FILE_ATTRIBUTE_NORMAL);
 #endif
   fs::remove(partial, error);
+}
+
+// Renames `from` over `to` and waits until the rename is on the disk, so that a power cut
+// leaves the old file or the new one in place, never an empty one.
+static std::error_code RenameDurably(const fs::path &from, const fs::path &to) {
+#ifdef _WIN32
+  if (MoveFileExW(from.c_str(), to.c_str(), MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH))
+    return {};
+  return std::error_code(static_cast<int>(GetLastError()), std::system_category());
+#else
+  std::error_code error;
+  fs::rename(from, to, error);
+  if (!error)
+    FlushFolder(to.parent_path());
+  return error;
+#endif
 }
 
 static std::optional<fs::perms> PermissionsOf(const fs::path &path) {
@@ -117,7 +157,7 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
     RemovePartial(temporary);
     return false;
   }
-  fs::rename(temporary, target, error);
+  error = RenameDurably(temporary, target);
   if (error) {
     failures.Add(target, "cannot be replaced (" + error.message() + ")");
     RemovePartial(temporary);
@@ -132,6 +172,7 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
   if (attributes != INVALID_FILE_ATTRIBUTES)
     SetFileAttributesW(target.c_str(), attributes & ~DWORD{FILE_ATTRIBUTE_READONLY});
 #endif
+  StepDone();
   return true;
 }
 
@@ -166,6 +207,7 @@ static bool CopyOver(const fs::path &source, const fs::path &target, Failures &f
     RemovePartial(temporary);
     return false;
   }
+  StepDone();
   return true;
 }
 
@@ -194,6 +236,7 @@ bool CopyJournaled(const fs::path &source, const fs::path &target, Failures &fai
     return false;
   }
   MakeBothNormal(source, target, failures);
+  StepDone();
   return true;
 }
 
@@ -216,8 +259,10 @@ bool RemoveFile(const fs::path &path, Failures &failures, const std::string &pro
 #endif
   std::error_code error;
   fs::remove(path, error);
-  if (!error)
+  if (!error) {
+    StepDone();
     return true;
+  }
 #ifdef _WIN32
   if (restore != INVALID_FILE_ATTRIBUTES)
     SetFileAttributesW(path.c_str(), restore);

@@ -11,9 +11,9 @@ bool MakeNormal(const std::filesystem::path &path, Failures &failures);
 // Makes `path` writable and changes nothing else. False, with the reason, when that fails.
 bool MakeWritable(const std::filesystem::path &path, Failures &failures);
 // Replaces `target` by `bytes` through a temporary file beside it and a rename, so that the file
-// is always either the old or the new one; a replaced file keeps its permissions (on Windows its
-// hidden and system attributes) and ends writable. Returns false, with the reason, on failure; the
-// old file is then left as it was.
+// is always either the old or the new one, also after a power cut (both are flushed to the disk); a
+// replaced file keeps its permissions (on Windows its hidden and system attributes) and ends
+// writable. Returns false, with the reason, on failure; the old file is then left as it was.
 bool WriteAtomically(const std::filesystem::path &target, const std::string &bytes,
                      Failures &failures);
 // Copies `source` over `target` through the temporary file "<target>.partial" and a rename, so
@@ -35,3 +35,9 @@ bool RemoveFile(const std::filesystem::path &path, Failures &failures,
 std::filesystem::path PartialPath(const std::filesystem::path &target);
 // Removes what a failed replacement left, but never a folder that merely has the temporary name.
 void RemovePartial(const std::filesystem::path &partial);
+// Waits until the entries of `folder` (a rename, a deletion) are on the disk; on Windows, where
+// renames are written through, it does nothing.
+void FlushFolder(const std::filesystem::path &folder);
+// Waits until everything written to the file system that holds `folder` is on the disk: one
+// flush for all the copies of an operation. On Windows it does nothing (see the README).
+void FlushFileSystem(const std::filesystem::path &folder);

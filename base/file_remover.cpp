@@ -3,6 +3,7 @@
 #include "base/file_ops.h"
 #include "base/links.h"
 #include "base/names.h"
+#include "base/step_seam.h"
 
 #include <cerrno>
 #include <system_error>
@@ -43,8 +44,10 @@ FileRemover::~FileRemover() {
 bool FileRemover::Remove(const std::string &name, Failures &failures) {
   if (descriptor_ < 0)
     return RemoveByPath(Child(folder_, name), failures);
-  if (::unlinkat(descriptor_, name.c_str(), 0) == 0)
+  if (::unlinkat(descriptor_, name.c_str(), 0) == 0) {
+    StepDone();
     return true;
+  }
   if (errno == ENOENT)
     return false;
   const std::error_code error(errno, std::generic_category());

@@ -96,11 +96,11 @@ bool MatchesPatternList(std::string_view name, std::string_view patterns) {
 namespace {
 
 // What a listing tells of one entry.
-enum class Kind { File, Folder, Other };
+enum class Kind { File, HiddenFile, Folder, Other };
 
 #ifdef _WIN32
 // Calls `visit` with each entry's name and kind, from one search; hidden and system files are
-// no files to the game.
+// told apart, as they are no files to the game.
 void ForEachEntry(const fs::path &folder,
                   const std::function<void(std::string &&name, Kind kind)> &visit) {
   WIN32_FIND_DATAW found;
@@ -115,8 +115,9 @@ void ForEachEntry(const fs::path &folder,
     if (name == L"." || name == L"..")
       continue;
     const Kind kind = (attributes & FILE_ATTRIBUTE_DIRECTORY) ? Kind::Folder
-                      : (attributes & (FILE_ATTRIBUTE_HIDDEN | FILE_ATTRIBUTE_SYSTEM)) ? Kind::Other
-                                                                                       : Kind::File;
+                      : (attributes & (FILE_ATTRIBUTE_HIDDEN | FILE_ATTRIBUTE_SYSTEM))
+                          ? Kind::HiddenFile
+                          : Kind::File;
     visit(NameText(fs::path(found.cFileName)), kind);
   } while (FindNextFileW(search, &found));
   FindClose(search);
@@ -158,20 +159,25 @@ void SortNames(std::vector<std::string> &names) {
 
 } // namespace
 
-void ForEachFile(const fs::path &folder, const std::function<void(std::string &&name)> &visit) {
+void ForEachFile(const fs::path &folder, const std::function<void(std::string &&name)> &visit,
+                 FileKinds kinds) {
   ForEachEntry(folder, [&](std::string &&name, Kind kind) {
-    if (kind == Kind::File)
+    if (kind == Kind::File || (kind == Kind::HiddenFile && kinds == FileKinds::WithHidden))
       visit(std::move(name));
   });
 }
 
-std::vector<std::string> ListFiles(const fs::path &folder, std::string_view patterns) {
+std::vector<std::string> ListFiles(const fs::path &folder, std::string_view patterns,
+                                   FileKinds kinds) {
   std::vector<std::string> names;
   const PatternList wanted(patterns);
-  ForEachFile(folder, [&](std::string &&name) {
-    if (wanted.Matches(name))
-      names.push_back(std::move(name));
-  });
+  ForEachFile(
+      folder,
+      [&](std::string &&name) {
+        if (wanted.Matches(name))
+          names.push_back(std::move(name));
+      },
+      kinds);
   SortNames(names);
   return names;
 }

@@ -11,15 +11,20 @@
 bool MatchesPattern(std::string_view name, std::string_view pattern);
 // Whether `name` matches any pattern of a ";"-separated list.
 bool MatchesPatternList(std::string_view name, std::string_view patterns);
-// Calls `visit` with the name of each plain file directly in `folder` (on Windows, not the hidden
-// or system ones), in the order the file system gives them. A folder that cannot be listed gives
-// no names.
+// Which files a listing gives: on Windows, hidden and system files are no files to the game, but
+// they are to the program when it keeps and puts back the game's own files.
+enum class FileKinds { Shown, WithHidden };
+// Calls `visit` with the name of each plain file directly in `folder` (on Windows, the hidden and
+// system ones only `WithHidden`), in the order the file system gives them. A folder that cannot
+// be listed gives no names.
 void ForEachFile(const std::filesystem::path &folder,
-                 const std::function<void(std::string &&name)> &visit);
+                 const std::function<void(std::string &&name)> &visit,
+                 FileKinds kinds = FileKinds::Shown);
 // Plain file names (no path) directly in `folder` that match the pattern list, in name order.
 // A folder that cannot be listed gives no names.
 std::vector<std::string> ListFiles(const std::filesystem::path &folder,
-                                   std::string_view patterns = "*.*");
+                                   std::string_view patterns = "*.*",
+                                   FileKinds kinds = FileKinds::Shown);
 // The names of the immediate subfolders of `folder`, in name order.
 std::vector<std::string> ListFolderNames(const std::filesystem::path &folder);
 // Full paths of the immediate subfolders of `folder`, in name order.

@@ -8,11 +8,14 @@
 NameIndex::NameIndex(const std::filesystem::path &folder, const std::vector<std::string> &wanted) {
   for (const std::string &name : wanted)
     byFolded_.try_emplace(FoldName(name));
-  ForEachFile(folder, [this](std::string &&name) {
-    const auto found = byFolded_.find(FoldName(name));
-    if (found != byFolded_.end())
-      found->second.push_back(std::move(name));
-  });
+  ForEachFile(
+      folder,
+      [this](std::string &&name) {
+        const auto found = byFolded_.find(FoldName(name));
+        if (found != byFolded_.end())
+          found->second.push_back(std::move(name));
+      },
+      FileKinds::WithHidden);
   // Several files differing only in case are rare; in name order, the choice among them does not
   // depend on the file system's order.
   for (auto &[folded, names] : byFolded_)

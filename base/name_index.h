@@ -8,7 +8,8 @@
 
 // The plain files of one folder that are named like one of the names asked about, by folded name
 // (see FoldName): a single listing answers any number of case-insensitive look-ups, and holds
-// only what is asked, however many files the folder has.
+// only what is asked, however many files the folder has. Hidden and system files count: a file
+// that a copy would replace is one, whatever its attributes.
 class NameIndex {
 public:
   // Lists `folder` once, keeping the files that equal one of `wanted` in any letter case.

@@ -36,6 +36,8 @@ std::error_code WriteNewFile(const fs::path &path, const std::string &bytes) {
     else
       error = LastError();
   }
+  if (!error && !FlushFileBuffers(file))
+    error = LastError();
   CloseHandle(file);
   return error;
 }
@@ -93,7 +95,7 @@ std::error_code WriteNewFile(const fs::path &path, const std::string &bytes) {
   if (file < 0)
     return LastError();
   std::error_code error;
-  if (!WriteAll(file, bytes.data(), bytes.size()))
+  if (!WriteAll(file, bytes.data(), bytes.size()) || ::fdatasync(file) != 0)
     error = LastError();
   if (::close(file) != 0 && !error)
     error = LastError();

@@ -4,9 +4,9 @@
 #include <string>
 #include <system_error>
 
-// Writes `bytes` into the new file `path`. The file is created only when no entry of that name
-// exists, so that a file or link planted there is never written through. Returns the error when
-// that fails.
+// Writes `bytes` into the new file `path` and flushes them to the disk. The file is created only
+// when no entry of that name exists, so that a file or link planted there is never written
+// through. Returns the error when that fails.
 std::error_code WriteNewFile(const std::filesystem::path &path, const std::string &bytes);
 // Copies the file `source` into the new file `path`, created the same way; a source that is a link
 // is refused. Returns the error when that fails; a file it created is then deleted again, so that

@@ -3,6 +3,7 @@
 #include "base/file_ops.h"
 #include "base/names.h"
 #include "base/plain_name.h"
+#include "base/step_seam.h"
 #include "base/text_file.h"
 
 #include <algorithm>
@@ -38,14 +39,25 @@ std::string FileLine(const PlacedFile &file, char mark) {
   return std::string("\t") + PlaceLetter(file.place) + mark + file.name;
 }
 
-std::optional<PlacedFile> ParseFileLine(const std::string &line) {
+// A file line of the ledger or the journal, and its mark.
+struct FileLineParts {
+  PlacedFile file;
+  char mark = ' ';
+};
+
+// The one place where file lines are read: a line that is no file line gives nothing.
+std::optional<FileLineParts> ParseFileLine(const std::string &line) {
   if (line.size() < 4 || line[0] != '\t')
     return std::nullopt;
   const std::optional<Place> place = PlaceFromLetter(line[1]);
   if (!place)
     return std::nullopt;
-  return PlacedFile{*place, line.substr(3)};
+  return FileLineParts{{*place, line.substr(3)}, line[2]};
 }
+
+// The marks of a leftover copy in the ledger: one to delete, one whose original comes back.
+constexpr char kLeftoverMark = '!';
+constexpr char kLeftoverOverOriginalMark = '^';
 
 } // namespace
 
@@ -74,9 +86,13 @@ Ledger Ledger::Read(const fs::path &keeping, Failures &failures) {
   bool inFolder = false;
   for (size_t at = 0; at < lines->size(); ++at) {
     const std::string &line = (*lines)[at];
-    if (const std::optional<PlacedFile> file = ParseFileLine(line)) {
-      if (inFolder && AcceptPlainName(file->name, keeping / kLedgerFile, at + 1, failures))
-        ledger.folders_.back().files.push_back(*file);
+    if (const std::optional<FileLineParts> parts = ParseFileLine(line)) {
+      if (!AcceptPlainName(parts->file.name, keeping / kLedgerFile, at + 1, failures))
+        continue;
+      if (parts->mark == kLeftoverMark || parts->mark == kLeftoverOverOriginalMark)
+        ledger.leftovers_.push_back({parts->file, parts->mark == kLeftoverOverOriginalMark});
+      else if (inFolder)
+        ledger.folders_.back().files.push_back(parts->file);
     } else if (Storable(line)) {
       inFolder = AcceptPlainName(line, keeping / kLedgerFile, at + 1, failures);
       if (inFolder)
@@ -88,6 +104,12 @@ Ledger Ledger::Read(const fs::path &keeping, Failures &failures) {
 
 bool Ledger::Write(const fs::path &keeping, Failures &failures) const {
   std::string text;
+  // Before the first folder line, so that they belong to no folder.
+  for (const FileStep &leftover : leftovers_)
+    if (Storable(leftover.file.name))
+      text += FileLine(leftover.file,
+                       leftover.keepOriginal ? kLeftoverOverOriginalMark : kLeftoverMark) +
+              "\r\n";
   for (const LoadedFolder &folder : folders_) {
     if (!Storable(folder.name))
       continue;
@@ -114,6 +136,18 @@ void Ledger::Remove(std::string_view name) {
                  folders_.end());
 }
 
+void Ledger::AddLeftovers(const std::vector<FileStep> &files) {
+  for (const FileStep &leftover : files)
+    if (!IsLeftover(PlaceKey(leftover.file.place, leftover.file.name)))
+      leftovers_.push_back(leftover);
+}
+
+bool Ledger::IsLeftover(const std::string &key) const {
+  return std::any_of(leftovers_.begin(), leftovers_.end(), [&](const FileStep &leftover) {
+    return PlaceKey(leftover.file.place, leftover.file.name) == key;
+  });
+}
+
 std::unordered_map<std::string, std::string> Ledger::LastProviders() const {
   std::unordered_map<std::string, std::string> providers;
   for (const LoadedFolder &folder : folders_)
@@ -138,9 +172,9 @@ std::optional<Journal> Journal::Read(const fs::path &keeping, Failures &failures
   if (!(*lines)[1].empty() && AcceptPlainName((*lines)[1], path, 2, failures))
     journal.folder = (*lines)[1];
   for (size_t i = 2; i < lines->size(); ++i)
-    if (const std::optional<PlacedFile> file = ParseFileLine((*lines)[i]))
-      if (AcceptPlainName(file->name, path, i + 1, failures))
-        journal.entries.push_back({*file, (*lines)[i][2] == '+'});
+    if (const std::optional<FileLineParts> parts = ParseFileLine((*lines)[i]))
+      if (AcceptPlainName(parts->file.name, path, i + 1, failures))
+        journal.entries.push_back({parts->file, parts->mark == '+'});
   return journal;
 }
 
@@ -160,8 +194,12 @@ bool Journal::Pending(const fs::path &keeping) {
 }
 
 void Journal::Remove(const fs::path &keeping) {
+  // The journal goes only once what it covers is on the disk, so that a power cut cannot leave
+  // half-written copies with no journal to clear them away.
+  FlushFileSystem(keeping);
   std::error_code error;
   fs::remove(keeping / kJournalFile, error);
+  FlushFolder(keeping);
 }
 
 bool MoveReplacing(const fs::path &from, const fs::path &to, Failures &failures) {
@@ -170,8 +208,10 @@ bool MoveReplacing(const fs::path &from, const fs::path &to, Failures &failures)
   if (fs::exists(to, error))
     MakeWritable(to, failures);
   fs::rename(from, to, error);
-  if (!error)
+  if (!error) {
+    StepDone();
     return true;
+  }
   // Another disk: a complete copy first, so that the file is never in neither place.
   return CopyReplacing(from, to, failures) && RemoveFile(from, failures);
 }

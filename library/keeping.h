@@ -27,6 +27,15 @@ struct LoadedFolder {
   std::vector<PlacedFile> files;
 };
 
+// One file an operation takes out of the game or puts in.
+struct FileStep {
+  PlacedFile file;
+  // The game's own file of this name is involved: a load moves it into the keeping folder
+  // first, an unload puts it back. Either way, to undo or finish the step, whatever is kept
+  // goes back, and while nothing is kept the game's file is that original and stays.
+  bool keepOriginal = false;
+};
+
 // The place and the folded name that identify one file of the game whatever its letter case.
 std::string PlaceKey(Place place, std::string_view name);
 
@@ -40,6 +49,13 @@ public:
   bool Write(const std::filesystem::path &keeping, Failures &failures) const;
 
   const LoadedFolder *Find(std::string_view name) const;
+  // Copies an unload could not delete (a file the game held open): still to be taken out at the
+  // next unload, Reset All or start, and never taken for an original.
+  const std::vector<FileStep> &Leftovers() const { return leftovers_; }
+  void SetLeftovers(std::vector<FileStep> files) { leftovers_ = std::move(files); }
+  void AddLeftovers(const std::vector<FileStep> &files);
+  // Whether the file `key` (see PlaceKey) is a leftover copy.
+  bool IsLeftover(const std::string &key) const;
   void Remove(std::string_view name);
   void Append(LoadedFolder folder) { folders_.push_back(std::move(folder)); }
   const std::vector<LoadedFolder> &Folders() const { return folders_; }
@@ -48,15 +64,13 @@ public:
 
 private:
   std::vector<LoadedFolder> folders_;
+  std::vector<FileStep> leftovers_;
 };
 
 // What an interrupted operation was doing, written before it touches a file.
 struct Journal {
   enum class Step { Load, Loaded, Unload, Reset, Restore };
-  struct Entry {
-    PlacedFile file;
-    bool keepOriginal = false; // the game's own file is moved into the keeping folder first
-  };
+  using Entry = FileStep;
   Step step = Step::Load;
   std::string folder;
   std::vector<Entry> entries;
@@ -65,6 +79,7 @@ struct Journal {
   // file left by an interrupted write of it is removed.
   static std::optional<Journal> Read(const std::filesystem::path &keeping, Failures &failures);
   bool Write(const std::filesystem::path &keeping, Failures &failures) const;
+  // Closes the journal once everything the operation wrote is on the disk.
   static void Remove(const std::filesystem::path &keeping);
   // Whether the keeping folder holds a journal, that is, an operation was interrupted.
   static bool Pending(const std::filesystem::path &keeping);

@@ -6,6 +6,7 @@
 #include "base/text_file.h"
 
 #include <algorithm>
+#include <unordered_set>
 
 namespace fs = std::filesystem;
 
@@ -15,9 +16,11 @@ fs::path RecordPath(const LibraryState &state) {
 
 std::string RecordText(const FolderGrid &grid) {
   std::string text;
+  // A folder listed under two categories of one letter has two rows, yet is loaded once.
+  std::unordered_set<std::string> written;
   for (int row = 1; row < grid.RowCount(); ++row) {
     const GridRow &r = grid.rows[static_cast<size_t>(row)];
-    if (IsLoaded(r))
+    if (IsLoaded(r) && written.insert(r.name).second)
       text += r.name + "\r\n";
   }
   return text + "\r\n";

@@ -8,7 +8,9 @@
 #include "library/game_places.h"
 #include "library/keeping.h"
 
+#include <optional>
 #include <set>
+#include <system_error>
 
 namespace fs = std::filesystem;
 
@@ -19,6 +21,18 @@ struct Copy {
   fs::path source;
   Journal::Entry entry;
 };
+
+// Whether an original of that name is kept already at `path`; nothing when that cannot be told
+// (a link or a folder in its place, an error), so that the game's file is left alone.
+std::optional<bool> OriginalKept(const fs::path &path) {
+  std::error_code error;
+  const fs::file_status status = fs::symlink_status(path, error);
+  if (status.type() == fs::file_type::not_found)
+    return false;
+  if (!error && fs::is_regular_file(status))
+    return true;
+  return std::nullopt;
+}
 
 // The copies a load makes, with the game's own files among their targets marked to be kept;
 // notes in `overwritten` the loaded folders whose files it replaces.
@@ -45,16 +59,45 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
     }
     const NameIndex &index = places.Index(place);
     const PlacedFile target{place, index.TargetName(name)};
-    const auto provider = providers.find(PlaceKey(place, target.name));
+    const std::string key = PlaceKey(place, target.name);
+    const auto provider = providers.find(key);
     bool keep = false;
-    // A copy this folder made before (a ledger out of step with the record) is no original.
-    if (provider != providers.end() && provider->second != NameText(folder))
+    // A copy this folder made before (a ledger out of step with the record) is no original, and
+    // neither is a copy an unload could not delete.
+    if (provider != providers.end() && provider->second != NameText(folder)) {
       overwritten.insert(provider->second);
-    else if (provider == providers.end() && !index.Matches(name).empty())
-      keep = !fs::exists(OriginalPath(keeping, target));
+    } else if (provider == providers.end() && !index.Matches(name).empty() &&
+               !ledger.IsLeftover(key)) {
+      const std::optional<bool> kept = OriginalKept(OriginalPath(keeping, target));
+      if (!kept) {
+        failures.Add(source, "not copied: the place for the game's own file in " +
+                                 DisplayPath(OriginalsFolder(keeping, place)) +
+                                 " is taken by something that is no file");
+        continue;
+      }
+      // Two files would claim to be the game's own (a saved game played on after an older one
+      // was kept): neither may be lost.
+      if (*kept) {
+        failures.Add(source, "not copied: the game's own file of that name is kept in " +
+                                 DisplayPath(OriginalsFolder(keeping, place)) +
+                                 " already, and the game holds another one that would be lost");
+        continue;
+      }
+      keep = true;
+    }
     copies.push_back({source, {target, keep}});
   }
   return copies;
+}
+
+// After a failed copy, the game's own file goes back at once rather than at the next unload.
+void PutOriginalBack(const fs::path &kept, const fs::path &destination, Failures &failures) {
+  if (MoveReplacing(kept, destination, failures))
+    failures.Add(destination, "is the game's own file again: it was put back because the copy "
+                              "failed");
+  else
+    failures.Add(destination,
+                 "is missing from the game: its original is kept in " + DisplayPath(kept));
 }
 
 } // namespace
@@ -91,8 +134,11 @@ std::vector<std::string> MoveIn(LibraryState &state, const fs::path &folder, Cap
     if (copy.entry.keepOriginal &&
         !MoveReplacing(destination, OriginalPath(keeping, target), failures))
       continue;
-    if (!CopyJournaled(copy.source, destination, failures))
+    if (!CopyJournaled(copy.source, destination, failures)) {
+      if (copy.entry.keepOriginal)
+        PutOriginalBack(OriginalPath(keeping, target), destination, failures);
       continue;
+    }
     loaded.files.push_back(target);
     ++state.tally.copied;
     caption.Set("Please wait- copying: :" + NameText(copy.source));

@@ -11,7 +11,9 @@
 // Loads the add-on folder `folder`: copies each of its files that does not stay in the library to
 // the game folder, "Savedata" or "Music", replacing a file of that name, and shows each copied
 // name in the caption. A game file that no loaded folder put there is first moved into the
-// keeping folder, to be put back when the last folder providing its name is unloaded. The
+// keeping folder, to be put back when the last folder providing its name is unloaded; where one
+// is kept already, the game's file is not replaced. When a copy fails after its original was
+// kept, the original goes back at once. The
 // journal is left at "loaded" for the caller to close once the record is written. Does nothing
 // while `Ready` is false or when `folder` is the game folder. A file that cannot be copied is
 // skipped and recorded in `failures`. Returns the loaded folders whose files it replaced.

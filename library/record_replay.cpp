@@ -15,6 +15,7 @@ void ReplayRecord(LibraryState &state, Caption &caption, Failures &failures) {
   std::unordered_multimap<std::string, int> rowsByName;
   for (int row = 1; row < grid.RowCount(); ++row)
     rowsByName.emplace(grid.Row(row).name, row);
+  std::vector<int> recorded;
   for (const std::string &line : ReadLoadedNames(state, failures)) {
     // A record written in Windows-1252 names the folders that UTF-8 names differently.
     const std::string name = rowsByName.count(line) ? line : TextAsUtf8(line);
@@ -28,5 +29,12 @@ void ReplayRecord(LibraryState &state, Caption &caption, Failures &failures) {
       grid.ColourRow(row, kLoadedColour);
       ClickRow(state, row, caption, failures);
     }
+    recorded.insert(recorded.end(), rows.begin(), rows.end());
+  }
+  // The click's one-per-category rule unmarks an earlier folder of the letter, yet its copies are
+  // in the game: every recorded folder shows loaded, so that it can be unloaded.
+  for (int row : recorded) {
+    grid.Row(row).mark = kLoadedMark;
+    grid.ColourRow(row, kLoadedColour);
   }
 }

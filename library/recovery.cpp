@@ -8,6 +8,7 @@
 #include "library/kept_links.h"
 #include "library/loaded_record.h"
 #include "library/reset_all.h"
+#include "library/save_files.h"
 #include "library/unplace.h"
 
 namespace fs = std::filesystem;
@@ -19,12 +20,11 @@ static void TakeOut(LibraryState &state, const Journal &journal, Caption &captio
   const fs::path keeping = KeepingFolder(state.LibDir);
   Ledger ledger = Ledger::Read(keeping, failures);
   ledger.Remove(journal.folder);
-  UnplaceFiles(state, ledger, journal.entries, true, caption, failures);
+  ledger.AddLeftovers(UnplaceFiles(state, ledger, journal.entries, true, caption, failures));
   // A save file carried home into a campaign folder may have been half copied.
   const fs::path folder = Child(state.LibDir, journal.folder);
   if (!journal.folder.empty() && !IsLink(folder))
-    for (const std::string &name : ListFiles(folder, "*.partial"))
-      RemovePartial(Child(folder, name));
+    RemoveHalfCarried(folder);
   ledger.Write(keeping, failures);
   SetRecorded(state, journal.folder, false, failures);
 }
@@ -51,7 +51,7 @@ void FinishInterrupted(LibraryState &state, Caption &caption, Failures &failures
     break;
   case Journal::Step::Reset:
   case Journal::Step::Restore:
-    FinishReset(state, std::move(*journal), caption, failures);
+    FinishReset(state, std::move(*journal), true, caption, failures);
     break;
   }
   Journal::Remove(keeping);

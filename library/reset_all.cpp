@@ -2,7 +2,6 @@
 
 #include "base/existence.h"
 #include "base/file_ops.h"
-#include "base/file_remover.h"
 #include "base/listing.h"
 #include "base/names.h"
 #include "base/text_file.h"
@@ -10,6 +9,10 @@
 #include "library/keeping.h"
 #include "library/kept_links.h"
 #include "library/loaded_record.h"
+#include "library/save_files.h"
+#include "library/unplace.h"
+
+#include <unordered_set>
 
 namespace fs = std::filesystem;
 
@@ -33,28 +36,39 @@ std::string CleanUpPatterns(const fs::path &libDir, Failures &failures) {
   return lines->front();
 }
 
+// The game-folder names the ledger lists, folded: an unload takes those out.
+static std::unordered_set<std::string> LedgerGameNames(const Ledger &ledger) {
+  std::unordered_set<std::string> names;
+  for (const LoadedFolder &folder : ledger.Folders())
+    for (const PlacedFile &file : folder.files)
+      if (file.place == Place::Game)
+        names.insert(FoldName(file.name));
+  for (const FileStep &leftover : ledger.Leftovers())
+    if (leftover.file.place == Place::Game)
+      names.insert(FoldName(leftover.file.name));
+  return names;
+}
+
 std::vector<std::string> CleanUpNames(const LibraryState &state, Failures &failures) {
+  const std::unordered_set<std::string> loaded =
+      LedgerGameNames(Ledger::Read(KeepingFolder(state.LibDir), failures));
   std::vector<std::string> names;
   for (std::string &name : ListFiles(state.EAWDir, CleanUpPatterns(state.LibDir, failures)))
-    if (!IsProtected(name))
+    if (!IsProtected(name) && loaded.count(FoldName(name)) == 0)
       names.push_back(std::move(name));
   return names;
 }
 
-int DeleteFiles(const fs::path &folder, const std::vector<std::string> &names, Caption &caption,
-                Failures &failures) {
-  FileRemover remover(folder);
-  int deleted = 0;
-  for (size_t done = 0; done < names.size(); ++done) {
-    caption.Progress(static_cast<int>(done + 1), static_cast<int>(names.size()));
-    deleted += remover.Remove(names[done], failures) ? 1 : 0;
-  }
-  return deleted;
-}
-
-void CleanUp(LibraryState &state, const std::vector<std::string> &names, Caption &caption,
-             Failures &failures) {
-  state.tally.removed += DeleteFiles(state.EAWDir, names, caption, failures);
+int LoadedFileCount(const LibraryState &state, Failures &failures) {
+  const Ledger ledger = Ledger::Read(KeepingFolder(state.LibDir), failures);
+  std::unordered_set<std::string> keys;
+  for (const LoadedFolder &folder : ledger.Folders())
+    for (const PlacedFile &file : folder.files)
+      if (!IsSaveFile(file.name))
+        keys.insert(PlaceKey(file.place, file.name));
+  for (const FileStep &leftover : ledger.Leftovers())
+    keys.insert(PlaceKey(leftover.file.place, leftover.file.name));
+  return static_cast<int>(keys.size());
 }
 
 void RestoreOriginals(LibraryState &state, Failures &failures) {
@@ -62,7 +76,7 @@ void RestoreOriginals(LibraryState &state, Failures &failures) {
   GamePlaces places(state.EAWDir);
   for (const Place place : {Place::Game, Place::Savedata, Place::Music}) {
     const fs::path kept = OriginalsFolder(keeping, place);
-    for (const std::string &name : ListFiles(kept)) {
+    for (const std::string &name : ListFiles(kept, "*.*", FileKinds::WithHidden)) {
       const fs::path target = Child(places.Folder(place), name);
       // A saved game of that name is the player's progress since: both stay.
       FileCheck(target);
@@ -74,21 +88,50 @@ void RestoreOriginals(LibraryState &state, Failures &failures) {
   }
 }
 
-void FinishReset(LibraryState &state, Journal journal, Caption &caption, Failures &failures) {
+void FinishReset(LibraryState &state, Journal journal, bool afterCrash, Caption &caption,
+                 Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
+  // No folder stays loaded, so each copy goes and each kept original comes back.
+  Ledger none;
+  if (journal.step == Journal::Step::Reset)
+    none.SetLeftovers(
+        UnplaceFiles(state, Ledger(), journal.entries, afterCrash, caption, failures));
+  else
+    none.SetLeftovers(Ledger::Read(keeping, failures).Leftovers());
+  none.Write(keeping, failures);
+  WriteAtomically(RecordPath(state), "", failures);
   if (journal.step == Journal::Step::Reset) {
-    std::vector<std::string> names;
-    for (const Journal::Entry &entry : journal.entries)
-      names.push_back(entry.file.name);
-    CleanUp(state, names, caption, failures);
     journal.step = Journal::Step::Restore;
     journal.entries.clear();
     journal.Write(keeping, failures);
   }
   RestoreOriginals(state, failures);
-  Ledger().Write(keeping, failures);
-  WriteAtomically(RecordPath(state), "", failures);
   Journal::Remove(keeping);
+}
+
+// The journal of a Reset All: every file of the loaded folders and every leftover copy, each
+// once, then the other files `names` the player agreed to.
+static Journal ResetJournal(const LibraryState &state, const Ledger &ledger,
+                            const std::vector<std::string> &names) {
+  std::vector<PlacedFile> files;
+  std::unordered_set<std::string> keys;
+  const auto add = [&](const PlacedFile &file) {
+    if (keys.insert(PlaceKey(file.place, file.name)).second)
+      files.push_back(file);
+  };
+  for (const LoadedFolder &folder : ledger.Folders())
+    for (const PlacedFile &file : folder.files)
+      add(file);
+  Journal journal{Journal::Step::Reset, "", {}};
+  for (const FileStep &leftover : ledger.Leftovers())
+    if (keys.insert(PlaceKey(leftover.file.place, leftover.file.name)).second)
+      journal.entries.push_back(leftover);
+  for (const std::string &name : names)
+    add({Place::Game, name});
+  for (FileStep &entry :
+       TakeOutEntries(files, Ledger(), KeptOriginals(KeepingFolder(state.LibDir))))
+    journal.entries.push_back(std::move(entry));
+  return journal;
 }
 
 // The record is now empty, so no row may stay marked: a later click would write it back.
@@ -108,11 +151,14 @@ void ResetAll(LibraryState &state, const std::vector<std::string> &names, Captio
     CaptionRestorer restorer(caption);
     state.Ready = true;
     caption.Set("Please wait... cleaning up");
-    Journal journal{Journal::Step::Reset, "", {}};
-    for (const std::string &name : names)
-      journal.entries.push_back({{Place::Game, name}, false});
+    const Ledger ledger = Ledger::Read(KeepingFolder(state.LibDir), failures);
+    // The save files of a loaded campaign go home first, as its unload would carry them.
+    for (const LoadedFolder &folder : ledger.Folders())
+      if (IsCampaignFolder(Child(state.LibDir, folder.name)))
+        CarrySaveFiles(state.EAWDir, Child(state.LibDir, folder.name), caption, failures);
+    Journal journal = ResetJournal(state, ledger, names);
     if (journal.Write(KeepingFolder(state.LibDir), failures))
-      FinishReset(state, std::move(journal), caption, failures);
+      FinishReset(state, std::move(journal), false, caption, failures);
     else
       failures.Add("Nothing was reset: the program cannot note what it is doing in " +
                    DisplayPath(KeepingFolder(state.LibDir)));

@@ -18,24 +18,24 @@ inline constexpr char kDefaultCleanUpPatterns[] =
 // The pattern list: the first line of the library's "CleanUp.ini" (any letter case), or the
 // default when the file is missing, unreadable or its first line is blank.
 std::string CleanUpPatterns(const std::filesystem::path &libDir, Failures &failures);
-// The plain files directly in the game folder that Reset All deletes, in name order: those that
-// match the pattern list, except the names the game itself keeps there.
+// The plain files directly in the game folder that Reset All deletes besides the copies of the
+// loaded folders, in name order: those that match the pattern list, except the names the game
+// itself keeps there and the names the loaded folders put there.
 std::vector<std::string> CleanUpNames(const LibraryState &state, Failures &failures);
-// Deletes each named file of `folder`, showing how far it is; one that cannot be deleted is
-// skipped and recorded. Returns how many were deleted.
-int DeleteFiles(const std::filesystem::path &folder, const std::vector<std::string> &names,
-                Caption &caption, Failures &failures);
-// Deletes the named add-on files (found by CleanUpNames) that are still in the game folder.
-void CleanUp(LibraryState &state, const std::vector<std::string> &names, Caption &caption,
-             Failures &failures);
+// How many files the loaded folders put into the game (each name once), with the copies an
+// unload could not delete: what Reset All takes out before it deletes the CleanUpNames.
+int LoadedFileCount(const LibraryState &state, Failures &failures);
 // Puts every original in the keeping folder back into the game; a saved game of the same name
 // that the game has again stays, and so does its original.
 void RestoreOriginals(LibraryState &state, Failures &failures);
-// Ends a Reset All noted in `journal`: deletes its files unless that was done, puts the originals
-// back, empties the ledger and the record and closes the journal. Also ends one that was
-// interrupted.
-void FinishReset(LibraryState &state, Journal journal, Caption &caption, Failures &failures);
-// "Reset All" of the files `names` the player agreed to: cleans up the game folder, puts the
-// kept originals back, empties the record and shows every row unloaded.
+// Ends a Reset All noted in `journal`: takes its files out unless that was done (copies that
+// cannot be deleted stay in the ledger as leftovers), empties the ledger and the record, puts the
+// originals back and closes the journal. Also ends one that was interrupted (`afterCrash`), as
+// each entry notes whether its original comes back.
+void FinishReset(LibraryState &state, Journal journal, bool afterCrash, Caption &caption,
+                 Failures &failures);
+// "Reset All" of the files `names` the player agreed to: unloads every loaded folder as an
+// unload does (its save files carried home, its copies taken out, the originals back), deletes
+// `names`, puts any other kept original back, empties the record and shows every row unloaded.
 void ResetAll(LibraryState &state, const std::vector<std::string> &names, Caption &caption,
               Failures &failures);

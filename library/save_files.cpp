@@ -33,3 +33,8 @@ void CarrySaveFiles(const fs::path &eawDir, const fs::path &campaign, Caption &c
                "was copied to " + DisplayPath(campaign) + " but cannot be deleted");
   }
 }
+
+void RemoveHalfCarried(const fs::path &campaign) {
+  for (const std::string &name : ListFiles(campaign, "*.sve.partial"))
+    RemovePartial(Child(campaign, name));
+}

@@ -13,3 +13,6 @@ bool IsCampaignFolder(const std::filesystem::path &folder);
 // recorded in `failures`; the others are still moved.
 void CarrySaveFiles(const std::filesystem::path &eawDir, const std::filesystem::path &campaign,
                     Caption &caption, Failures &failures);
+// Removes what a carry of save files into `campaign` cut short by a crash left: its temporary
+// copies "*.sve.partial", and no other file of the folder.
+void RemoveHalfCarried(const std::filesystem::path &campaign);

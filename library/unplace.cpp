@@ -5,26 +5,44 @@
 #include "base/names.h"
 #include "library/game_places.h"
 
-#include <unordered_set>
+#include <system_error>
 
 namespace fs = std::filesystem;
 
-// The kept originals by PlaceKey, listed once.
-static std::unordered_set<std::string> KeptOriginals(const fs::path &keeping) {
+std::unordered_set<std::string> KeptOriginals(const fs::path &keeping) {
   std::unordered_set<std::string> kept;
   for (const Place place : {Place::Game, Place::Savedata, Place::Music})
-    for (const std::string &name : ListFiles(OriginalsFolder(keeping, place)))
-      kept.insert(PlaceKey(place, name));
+    ForEachFile(
+        OriginalsFolder(keeping, place),
+        [&](std::string &&name) { kept.insert(PlaceKey(place, name)); }, FileKinds::WithHidden);
   return kept;
 }
 
-void UnplaceFiles(LibraryState &state, const Ledger &ledger,
-                  const std::vector<Journal::Entry> &entries, bool afterCrash, Caption &caption,
-                  Failures &failures) {
+std::vector<Journal::Entry> TakeOutEntries(const std::vector<PlacedFile> &files,
+                                           const Ledger &ledger,
+                                           const std::unordered_set<std::string> &kept) {
+  const auto providers = ledger.LastProviders();
+  std::vector<Journal::Entry> entries;
+  for (const PlacedFile &file : files) {
+    const std::string key = PlaceKey(file.place, file.name);
+    entries.push_back({file, providers.count(key) == 0 && kept.count(key) > 0});
+  }
+  return entries;
+}
+
+// Whether an entry of that name is still in `folder`, without following a link.
+static bool StillThere(const fs::path &folder, const std::string &name) {
+  std::error_code error;
+  return fs::exists(fs::symlink_status(Child(folder, name), error));
+}
+std::vector<FileStep> UnplaceFiles(LibraryState &state, const Ledger &ledger,
+                                   const std::vector<Journal::Entry> &entries, bool afterCrash,
+                                   Caption &caption, Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
   const auto providers = ledger.LastProviders();
   const std::unordered_set<std::string> kept = KeptOriginals(keeping);
   GamePlaces places(state.EAWDir);
+  std::vector<FileStep> leftovers;
   int done = 0;
   for (const Journal::Entry &entry : entries) {
     caption.Progress(++done, static_cast<int>(entries.size()));
@@ -36,9 +54,7 @@ void UnplaceFiles(LibraryState &state, const Ledger &ledger,
       RemovePartial(PartialPath(Child(folder, file.name)));
     const std::string key = PlaceKey(file.place, file.name);
     const bool originalKept = kept.count(key) > 0;
-    if (entry.keepOriginal && !originalKept)
-      continue;
-    const auto provider = providers.find(key);
+    const auto provider = entry.keepOriginal ? providers.end() : providers.find(key);
     if (provider != providers.end()) {
       caption.Set("Please wait- copying: :" + file.name);
       if (CopyReplacing(FindAnyCase(Child(state.LibDir, provider->second), file.name),
@@ -47,10 +63,27 @@ void UnplaceFiles(LibraryState &state, const Ledger &ledger,
     } else if (originalKept) {
       if (MoveReplacing(OriginalPath(keeping, file), Child(folder, file.name), failures))
         ++state.tally.restored;
-    } else {
+      else
+        leftovers.push_back({file, true});
+    } else if (!entry.keepOriginal) {
       caption.Set("Deleting " + file.name);
       if (places.Remover(file.place).Remove(file.name, failures))
         ++state.tally.removed;
+      else if (StillThere(folder, file.name))
+        leftovers.push_back({file, false});
     }
   }
+  return leftovers;
+}
+
+bool RetryLeftovers(LibraryState &state, Ledger &ledger, Caption &caption, Failures &failures) {
+  if (ledger.Leftovers().empty())
+    return false;
+  const auto providers = ledger.LastProviders();
+  std::vector<FileStep> entries;
+  for (const FileStep &leftover : ledger.Leftovers())
+    if (providers.count(PlaceKey(leftover.file.place, leftover.file.name)) == 0)
+      entries.push_back(leftover);
+  ledger.SetLeftovers(UnplaceFiles(state, Ledger(), entries, false, caption, failures));
+  return true;
 }

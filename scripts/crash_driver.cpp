@@ -3,12 +3,14 @@
 //   click NAME       start-up, then a click on the folder row NAME (load or unload)
 //   reset            start-up, then Reset All of every file it lists
 //   music            start-up, then a switch to the first music set listed
+//   ini              start-up, then eaw.ini saved from the editor with the same text each time
 //   manifest FILE    notes the player's files (game folder and Savedata) and their checksums
 //   check FILE       prints each damage found and exits 1 when there is any
 #include "app/selector.h"
 #include "base/listing.h"
 #include "base/names.h"
 #include "base/text_file.h"
+#include "library/file_rules.h"
 #include "library/game_places.h"
 #include "library/keeping.h"
 #include "library/loaded_record.h"
@@ -67,15 +69,41 @@ bool Found(const fs::path &game, const std::string &relative, const std::string 
   return false;
 }
 
+// Notes each add-on file in the game that is neither the player's nor listed in the ledger: a
+// copy left behind as if it were the game's own.
+void LeftBehind(const fs::path &game, const Ledger &ledger, const std::set<std::string> &players,
+                std::set<std::string> &damage) {
+  std::set<std::string> listed;
+  for (const LoadedFolder &folder : ledger.Folders())
+    for (const PlacedFile &file : folder.files)
+      listed.insert(PlaceKey(file.place, file.name));
+  for (const FileStep &leftover : ledger.Leftovers())
+    listed.insert(PlaceKey(leftover.file.place, leftover.file.name));
+  GamePlaces places(game);
+  for (const fs::path &folder : ListFolders(game / "ZEP128"))
+    for (const std::string &name : ListFiles(folder)) {
+      const Place place = PlaceOf(name);
+      const std::string relative = (place == Place::Savedata ? "Savedata/" : "") + name;
+      if (StaysInLibrary(name) || IsSaveFile(name) || place == Place::Music ||
+          players.count(relative) || listed.count(PlaceKey(place, name)))
+        continue;
+      if (fs::exists(FindAnyCase(places.Folder(place), name)))
+        damage.insert("add-on copy left behind: " + relative);
+    }
+}
+
 int Check(const fs::path &game, const fs::path &manifest) {
   std::set<std::string> damage;
   for (const auto &entry : fs::recursive_directory_iterator(game))
     if (EndsWith(NameText(entry.path()), ".partial"))
       damage.insert("temporary file left: " + DisplayPath(entry.path()));
   std::ifstream in(manifest);
-  for (std::string sum, name; in >> sum && std::getline(in >> std::ws, name);)
+  std::set<std::string> players;
+  for (std::string sum, name; in >> sum && std::getline(in >> std::ws, name);) {
+    players.insert(name);
     if (!Found(game, name, sum))
       damage.insert("player's file lost or changed: " + name);
+  }
   const LibraryState state = LibraryFor(game);
   Failures ignored;
   const fs::path keeping = KeepingFolder(state.LibDir);
@@ -98,6 +126,7 @@ int Check(const fs::path &game, const fs::path &manifest) {
               Checksum(FindAnyCase(Child(state.LibDir, provider), file.name)))
         damage.insert("game file is not the loaded folder's copy: " + file.name);
   }
+  LeftBehind(game, ledger, players, damage);
   if (!fs::is_directory(FindAnyCase(game, "Music")))
     damage.insert("the game has no Music folder");
   for (const std::string &line : damage)
@@ -131,6 +160,8 @@ int main(int argc, char **argv) {
       }
   } else if (step == "reset") {
     selector.ResetAll(selector.ResetAllFiles(failures), failures);
+  } else if (step == "ini") {
+    selector.SaveSettingsFile("[Main]\r\nWidth=800", failures);
   } else if (step == "music") {
     const MusicList music = selector.MusicSets(failures);
     if (music.current && !music.entries.empty())

@@ -72,8 +72,27 @@ TEST_F(WindowsFiles, ReadOnlyHiddenAndSystemFilesAreReplacedAndDeleted) {
   Give(InGame("two.dat"), FILE_ATTRIBUTE_READONLY | FILE_ATTRIBUTE_HIDDEN);
   Unload("S-One");
   EXPECT_FALSE(game.Exists("one.dat"));
-  EXPECT_FALSE(game.Exists("planes.dat"));
+  // The game's own file was kept like any other, and is back hidden and system as it was.
+  EXPECT_EQ(game.Read("planes.dat"), "the game's");
+  EXPECT_TRUE(Has(InGame("planes.dat"), FILE_ATTRIBUTE_HIDDEN));
+  EXPECT_TRUE(Has(InGame("planes.dat"), FILE_ATTRIBUTE_SYSTEM));
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
+}
+
+TEST_F(WindowsFiles, ACopyHeldOpenAtItsUnloadIsTakenOutAtTheNextOne) {
+  game.Addon("S-One", {"one.dat"});
+  game.Addon("S-Two", {"two.dat"});
+  Load("S-One");
+  Load("S-Two");
+  {
+    const HeldOpen held(InGame("one.dat"));
+    ASSERT_TRUE(held.Held());
+    Unload("S-One");
+    EXPECT_TRUE(game.Exists("one.dat"));
+  }
+  EXPECT_NE(failures.Message("").find("one.dat"), std::string::npos);
+  Unload("S-Two");
+  EXPECT_FALSE(game.Exists("one.dat"));
 }
 
 TEST_F(WindowsFiles, ResetAllDeletesReadOnlyFilesAndKeepsHiddenOnes) {

@@ -51,11 +51,7 @@ TEST_F(GridClick, ReplayMarksRowsWithoutTouchingFiles) {
     EXPECT_TRUE(game.Exists(kept)) << kept;
   EXPECT_FALSE(game.Exists("ZEP128/C-A/war.sve"));
   EXPECT_EQ(game.Record(), record);
-  EXPECT_EQ(Row("C-A").mark, "");
-  EXPECT_EQ(Row("C-B").mark, "S");
-  // Of the four S rows only the last replayed one stays marked.
-  const FolderGrid &grid = State().Unigrid;
-  EXPECT_EQ(grid.Row(RowOf(grid, "S-Two", RowOf(grid, "S-Two"))).mark, "S");
-  EXPECT_EQ(Row("S-One").mark, "");
-  EXPECT_EQ(Row("S-Two").mark, "");
+  // Each recorded folder has copies in the game, so each shows loaded, two of a letter too.
+  for (const char *loaded : {"C-A", "C-B", "S-One", "S-Two"})
+    EXPECT_EQ(Row(loaded).mark, "S") << loaded;
 }

@@ -88,3 +88,12 @@ TEST_F(Links, LinkedSetupsAreNeitherReadNorWrittenNorDeleted) {
   EXPECT_EQ(selector.SwitchToSetup("target", failures), "");
   ExpectOutsideUntouched();
 }
+
+TEST_F(Links, APlaceForTheGamesOwnFileTakenByALinkLoopLeavesThatFileAlone) {
+  game.Write("planes.dat", "own");
+  game.MakeFolder("ZEP128/#Selector/originals/G");
+  fs::create_symlink("planes.dat", game.Path() / "ZEP128/#Selector/originals/G/planes.dat");
+  selector.ClickRow(1, failures);
+  EXPECT_EQ(game.Read("planes.dat"), "own");
+  EXPECT_NE(failures.Message("").find("planes.dat"), std::string::npos);
+}

@@ -1,5 +1,6 @@
 #include "base/listing.h"
 #include "base/names.h"
+#include "library/ledger_check.h"
 #include "library/move_in.h"
 #include "library/move_out.h"
 #include "library/save_files.h"
@@ -21,6 +22,13 @@ struct Game {
   Game() { state.Ready = true; }
   void Load(const std::string &name) { MoveIn(state, folder.Addon(name), caption, failures); }
   void Unload(const std::string &name) { MoveOut(state, folder.Addon(name), caption, failures); }
+  // Unloads a folder recorded loaded before the ledger was kept, as after the first start.
+  void UnloadRecorded(const std::string &name) {
+    folder.WithRecord(name + "\r\n");
+    Failures notice;
+    MendRecordFromLedger(state, caption, notice);
+    Unload(name);
+  }
   bool Shown(const std::string &text) const { return caption.Showed(text); }
 };
 
@@ -89,7 +97,7 @@ TEST(MoveOut, DeletesOnlyTheCopiesLoadingMade) {
   for (const char *name : {"Savedata/A.MSN", "Music/c.bgm", "PLANES.DAT", "dup.dat", "DUP.DAT",
                            "contents.txt", "MYPIC", "pic.jpg", "Savedata/keep.sve"})
     game.folder.Write(name);
-  game.Unload("S-Out");
+  game.UnloadRecorded("S-Out");
 
   for (const char *gone : {"Savedata/A.MSN", "Music/c.bgm", "PLANES.DAT"})
     EXPECT_FALSE(game.folder.Exists(gone)) << gone;

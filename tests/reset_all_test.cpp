@@ -50,8 +50,8 @@ TEST_F(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
     EXPECT_TRUE(game.Exists("ZEP128/FoldersLoaded.txt"));
     EXPECT_EQ(game.Record(), "");
   }
-  EXPECT_EQ(caption.shown, (Names{"Please wait... cleaning up", "Selector",
-                                  "Please wait... cleaning up", "Selector"}));
+  EXPECT_EQ(caption.shown.front(), "Please wait... cleaning up");
+  EXPECT_EQ(caption.text, "Selector");
   EXPECT_TRUE(state.Ready);
   EXPECT_EQ(state.Unigrid.rows[1].mark, "");
   EXPECT_EQ(state.Unigrid.rows[1].nameColour, 0xFFFFFFu);
@@ -75,7 +75,7 @@ TEST_F(ResetAll, AFileThatCannotBeDeletedIsSkippedAndNamed) {
   // Something took the file's place after the listing: a folder that is not empty stays put.
   fs::remove(game.Path() / "pic1.bmp");
   game.Write("pic1.bmp/keep.txt");
-  DeleteFiles(state.EAWDir, names, caption, failures);
+  ::ResetAll(state, names, caption, failures);
   EXPECT_FALSE(game.Exists("mypic"));
   EXPECT_FALSE(game.Exists("readme.txt"));
   ASSERT_EQ(failures.Lines().size(), 1u);

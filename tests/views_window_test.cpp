@@ -4,6 +4,7 @@
 #include <QApplication>
 #include <QImage>
 #include <QTest>
+#include <QTimer>
 #include <gtest/gtest.h>
 
 namespace fs = std::filesystem;
@@ -88,12 +89,18 @@ TEST(ViewsWindow, ResetAllAsksThenDeletesAddOnFilesAndUnmarksEveryRow) {
   driver.ClickRow(1);
   ASSERT_TRUE(game.Exists("planes.dat"));
   auto *resetAll = driver.Find<QPushButton>("Command1");
-  EXPECT_EQ(driver.AnswerNextBox(QMessageBox::Cancel,
-                                 [&] { QTest::mouseClick(resetAll, Qt::LeftButton); }),
-            "Reset All will delete 3 files from the game folder, and put back the game's own "
-            "files that add-ons replaced. The loaded folders are saved first as the setup \"Before "
-            "Reset All\": switching to it (right-click the folder grid) loads them again. The "
-            "files:\npic1.bmp\nplanes.dat\nreadme.txt");
+  // Enter answers with the default button, Cancel: nothing is deleted.
+  QString question;
+  QTimer::singleShot(0, [&] {
+    if (auto *box = qobject_cast<QMessageBox *>(QApplication::activeModalWidget())) {
+      question = box->text();
+      QTest::keyClick(box, Qt::Key_Return);
+    }
+  });
+  QTest::mouseClick(resetAll, Qt::LeftButton);
+  EXPECT_EQ(question, "Reset All will unload every loaded folder: it takes out the 1 file they "
+                      "put into the game and puts back the game's own files they replaced. It "
+                      "also deletes these 2 files from the game folder:\npic1.bmp\nreadme.txt");
   EXPECT_TRUE(game.Exists("readme.txt"));
   EXPECT_EQ(driver.Grid()->model()->index(0, 2).data().toString(), "S");
   driver.AnswerNextBox(QMessageBox::Ok, [&] { QTest::mouseClick(resetAll, Qt::LeftButton); });

@@ -66,13 +66,22 @@ void ShowNotice(QWidget *parent, const std::string &notice) {
   box->open();
 }
 
-bool ConfirmDeletion(QWidget *parent, const std::vector<std::string> &names) {
-  const std::string heading = "Reset All will delete " + std::to_string(names.size()) +
-                              (names.size() == 1 ? " file" : " files") +
-                              " from the game folder, and put back the game's own files that "
-                              "add-ons replaced. The loaded folders are saved first as the setup "
-                              "\"Before Reset All\": switching to it (right-click the folder grid) "
-                              "loads them again. The files:";
+// "3 files", "1 file".
+static std::string Files(size_t count) {
+  return std::to_string(count) + (count == 1 ? " file" : " files");
+}
+
+bool ConfirmDeletion(QWidget *parent, int loadedFiles, const std::vector<std::string> &names) {
+  std::string heading =
+      loadedFiles > 0
+          ? "Reset All will unload every loaded folder: it takes out the " +
+                Files(static_cast<size_t>(loadedFiles)) +
+                " they put into the game and puts back the game's own files they replaced."
+          : "Reset All will put back the game's own files that add-ons replaced.";
+  heading += " The loaded folders are saved first as the setup \"Before Reset All\": switching "
+             "to it (right-click the folder grid) loads them again.";
+  if (!names.empty())
+    heading += " It also deletes these " + Files(names.size()) + " from the game folder:";
   QMessageBox *box =
       ListBox(parent, QMessageBox::Question, heading, names, QMessageBox::Ok | QMessageBox::Cancel);
   box->setObjectName("ConfirmResetAll");

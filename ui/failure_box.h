@@ -13,6 +13,7 @@ void ShowFailures(QWidget *parent, const Failures &failures, const QString &head
 // Tells the user `notice` in a box over `parent`: its first line, then the first of its further
 // lines and all of them under "Show Details". Nothing when it is empty.
 void ShowNotice(QWidget *parent, const std::string &notice);
-// Asks before files are deleted: a box with their number, the first names and the whole list
-// under "Show Details". True when the user chose OK.
-bool ConfirmDeletion(QWidget *parent, const std::vector<std::string> &names);
+// Asks before Reset All: a box with how many files of loaded folders it takes out, how many other
+// files `names` it deletes, their first names and the whole list under "Show Details". Cancel is
+// the default button. True when the user chose OK.
+bool ConfirmDeletion(QWidget *parent, int loadedFiles, const std::vector<std::string> &names);

@@ -179,7 +179,8 @@ void MainWindow::Label33_Click() {
 void MainWindow::Command1_Click() {
   Failures failures;
   const std::vector<std::string> names = selector_.ResetAllFiles(failures);
-  if (!names.empty() && !ConfirmDeletion(this, names))
+  const int loadedFiles = selector_.ResetAllLoadedFiles(failures);
+  if ((loadedFiles > 0 || !names.empty()) && !ConfirmDeletion(this, loadedFiles, names))
     return;
   {
     const InputBlocker blocker;

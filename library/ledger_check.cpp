@@ -1,0 +1,117 @@
+#include "library/ledger_check.h"
+
+#include "base/existence.h"
+#include "base/file_ops.h"
+#include "base/listing.h"
+#include "base/names.h"
+#include "base/text_encoding.h"
+#include "base/text_file.h"
+#include "library/file_rules.h"
+#include "library/game_places.h"
+#include "library/keeping.h"
+#include "library/loaded_record.h"
+#include "library/save_files.h"
+#include "library/unplace.h"
+
+#include <algorithm>
+#include <set>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+// The copies a folder loaded before the ledger made: its files found in the game in any case;
+// two game files of one name are no copy of it.
+LoadedFolder FoundCopies(const fs::path &eawDir, const fs::path &folder) {
+  LoadedFolder loaded{NameText(folder), {}};
+  const std::vector<std::string> names = ListFiles(folder);
+  GamePlaces places(eawDir, names);
+  for (const std::string &name : names) {
+    if (StaysInLibrary(name) || IsSaveFile(name))
+      continue;
+    const Place place = PlaceOf(name);
+    const std::vector<std::string> &matches = places.Index(place).Matches(name);
+    if (matches.size() == 1)
+      loaded.files.push_back({place, matches.front()});
+  }
+  return loaded;
+}
+
+Ledger LedgerFromRecord(const LibraryState &state, const std::vector<std::string> &recorded) {
+  Ledger ledger;
+  std::set<std::string> seen;
+  for (const std::string &line : recorded) {
+    // A record written in Windows-1252 names the folders that UTF-8 names differently.
+    std::string name = NameFromText(line);
+    FolderCheck(Child(state.LibDir, name));
+    if (!FolderFound) {
+      name = TextAsUtf8(line);
+      FolderCheck(Child(state.LibDir, name));
+    }
+    if (FolderFound && seen.insert(name).second)
+      ledger.Append(FoundCopies(state.EAWDir, Child(state.LibDir, name)));
+  }
+  return ledger;
+}
+
+std::string Quoted(const std::vector<std::string> &names) {
+  std::string text;
+  for (const std::string &name : names)
+    text += (text.empty() ? "\"" : ", \"") + name + "\"";
+  return text;
+}
+
+// Rewrites the record from the ledger where the two name different folders, and says what
+// changed.
+void FollowLedger(const LibraryState &state, const Ledger &ledger,
+                  const std::vector<std::string> &recorded, Failures &failures) {
+  std::vector<std::string> loaded;
+  for (const LoadedFolder &folder : ledger.Folders())
+    loaded.push_back(folder.name);
+  const std::set<std::string> inLedger(loaded.begin(), loaded.end());
+  std::set<std::string> inRecord;
+  for (const std::string &line : recorded)
+    inRecord.insert(inLedger.count(line) ? line : TextAsUtf8(line));
+  if (inRecord == inLedger)
+    return;
+  std::vector<std::string> added, dropped;
+  std::set_difference(inLedger.begin(), inLedger.end(), inRecord.begin(), inRecord.end(),
+                      std::back_inserter(added));
+  std::set_difference(inRecord.begin(), inRecord.end(), inLedger.begin(), inLedger.end(),
+                      std::back_inserter(dropped));
+  if (!WriteAtomically(RecordPath(state), JoinCrLf(loaded) + "\r\n", failures))
+    return;
+  std::string text = "The record of loaded folders did not agree with the files in the game, "
+                     "and was mended:";
+  if (!added.empty())
+    text += " " + Quoted(added) + (added.size() == 1 ? " is" : " are") + " loaded.";
+  if (!dropped.empty())
+    text += " " + Quoted(dropped) + (dropped.size() == 1 ? " is" : " are") + " not loaded.";
+  failures.Add(text);
+}
+
+} // namespace
+
+void MendRecordFromLedger(LibraryState &state, Caption &caption, Failures &failures) {
+  const fs::path keeping = KeepingFolder(state.LibDir);
+  const std::vector<std::string> recorded = ReadLoadedNames(state, failures);
+  FolderCheck(keeping);
+  if (!FolderFound) {
+    if (recorded.empty())
+      return;
+    const Ledger ledger = LedgerFromRecord(state, recorded);
+    if (ledger.Write(keeping, failures))
+      failures.Add("The folders recorded as loaded were loaded by an earlier version of the "
+                   "program; each of their files found in the game is now taken for their copy.");
+    FollowLedger(state, ledger, recorded, failures);
+    return;
+  }
+  Ledger ledger = Ledger::Read(keeping, failures);
+  // A Reset All cut short while it carried a campaign's saved games home has no journal yet.
+  for (const LoadedFolder &folder : ledger.Folders())
+    if (IsCampaignFolder(Child(state.LibDir, folder.name)))
+      RemoveHalfCarried(Child(state.LibDir, folder.name));
+  if (RetryLeftovers(state, ledger, caption, failures))
+    ledger.Write(keeping, failures);
+  FollowLedger(state, ledger, recorded, failures);
+}

@@ -1,0 +1,174 @@
+#include "app/selector.h"
+#include "base/names.h"
+#include "base/step_seam.h"
+#include "library/keeping.h"
+#include "library/loaded_record.h"
+#include "tests/game_folder.h"
+
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <functional>
+#include <map>
+#include <memory>
+#include <set>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+using Files = std::map<std::string, std::string>; // game path -> bytes
+
+// What each add-on folder puts where, and the game's own files before any load.
+const std::map<std::string, Files> kFolders = {
+    {"N-A", {{"sky.spt", "A sky"}, {"bases.dat", "A bases"}, {"Savedata/a.msn", "A mission"}}},
+    {"N-B", {{"sky.spt", "B sky"}, {"bases.dat", "B bases"}}},
+    {"S-X", {{"game.cfg", "X cfg"}, {"x.dat", "X x"}}},
+    {"S-Y", {{"game.cfg", "Y cfg"}, {"y.dat", "Y y"}}}};
+const Files kOwn = {
+    {"bases.dat", "own bases"}, {"game.cfg", "own cfg"}, {"Savedata/a.msn", "player's mission"}};
+
+// Stops the operation at its n-th committed step by throwing, as a kill there would.
+struct Killed {};
+class StopAtStep {
+public:
+  explicit StopAtStep(int step) {
+    SetStepHook([this, step] {
+      if (++count_ == step)
+        throw Killed{};
+    });
+  }
+  ~StopAtStep() { SetStepHook({}); }
+
+private:
+  int count_ = 0;
+};
+
+// One operation: the folders loaded before it, and what it does.
+struct Operation {
+  const char *name;
+  std::vector<std::string> before;
+  std::function<void(Selector &, Failures &)> run;
+};
+
+void PrintTo(const Operation &operation, std::ostream *out) { *out << operation.name; }
+
+void Click(Selector &selector, const std::string &folder, Failures &failures) {
+  selector.ClickRow(RowOf(selector.State().Unigrid, folder), failures);
+}
+
+std::function<void(Selector &, Failures &)> Clicks(const std::string &folder) {
+  return [folder](Selector &selector, Failures &failures) { Click(selector, folder, failures); };
+}
+
+class CrashSteps : public ::testing::TestWithParam<Operation> {
+protected:
+#ifndef _WIN32
+  // Hundreds of operations, each flushed to the disk: on a memory file system where there is
+  // one, so that the flushes cost nothing.
+  void SetUp() override {
+    if (const char *old = std::getenv("TMPDIR"))
+      oldTemporary = old;
+    std::error_code error;
+    if (fs::is_directory("/dev/shm", error))
+      ::setenv("TMPDIR", "/dev/shm", 1);
+  }
+  void TearDown() override {
+    if (oldTemporary.empty())
+      ::unsetenv("TMPDIR");
+    else
+      ::setenv("TMPDIR", oldTemporary.c_str(), 1);
+  }
+  std::string oldTemporary;
+#endif
+  // A fresh game with the folders `before` loaded; true when the operation was killed at `step`
+  // (0 for none) and the recovery then at `recoveryStep`.
+  bool KillAt(int step, int recoveryStep) {
+    game = std::make_unique<GameFolder>();
+    game->WithGameFolders().WithCategories("Sounds: N\r\nSkins: S\r\n");
+    for (const auto &[folder, files] : kFolders)
+      for (const auto &[path, bytes] : files)
+        game->Write("ZEP128/" + folder + "/" + NameText(fs::path(path)), bytes);
+    for (const auto &[path, bytes] : kOwn)
+      game->Write(path, bytes);
+    Start();
+    for (const std::string &folder : GetParam().before)
+      Click(*selector, folder, failures);
+    bool killed = false;
+    try {
+      const StopAtStep stop(step);
+      GetParam().run(*selector, failures);
+    } catch (const Killed &) {
+      killed = true;
+    }
+    if (killed && recoveryStep > 0) {
+      try {
+        const StopAtStep stop(recoveryStep);
+        Start();
+        killed = false;
+      } catch (const Killed &) {
+      }
+    }
+    Start();
+    return killed;
+  }
+  void Start() {
+    selector = std::make_unique<Selector>(game->Path(), caption, starter);
+    selector->StartUp(failures);
+  }
+  // The game as the ledger says it must be: each name the copy of the last loaded folder that
+  // provides it, else the game's own file, else nothing; record and ledger agree, no journal and
+  // no temporary file is left.
+  void ExpectAsTheLedgerSays(const std::string &where) {
+    Failures ignored;
+    const Ledger ledger = Ledger::Read(game->Library() / kKeepingFolder, ignored);
+    Files expected = kOwn;
+    std::set<std::string> loaded;
+    for (const LoadedFolder &folder : ledger.Folders()) {
+      loaded.insert(folder.name);
+      for (const auto &[path, bytes] : kFolders.at(folder.name))
+        expected[path] = bytes;
+    }
+    for (const auto &[folder, files] : kFolders)
+      for (const auto &[path, bytes] : files) {
+        const std::string found = game->Exists(path) ? game->Read(path) : "(none)";
+        EXPECT_EQ(found, expected.count(path) ? expected[path] : "(none)") << path << where;
+      }
+    const std::vector<std::string> names = ReadLoadedNames(LibraryFor(game->Path()), ignored);
+    EXPECT_EQ(std::set<std::string>(names.begin(), names.end()), loaded) << where;
+    EXPECT_FALSE(game->Exists("ZEP128/#Selector/journal.txt")) << where;
+    for (const auto &entry : fs::recursive_directory_iterator(game->Path()))
+      EXPECT_NE(entry.path().extension(), ".partial") << entry.path() << where;
+  }
+
+  std::unique_ptr<GameFolder> game;
+  RecordingCaption caption;
+  NotingStarter starter;
+  std::unique_ptr<Selector> selector;
+  Failures failures;
+};
+
+} // namespace
+
+// A kill after each step of the operation, and then after each step of the recovery.
+TEST_P(CrashSteps, EveryKillLeavesTheGameAsTheLedgerSays) {
+  for (int step = 1; KillAt(step, 0); ++step)
+    for (int recoveryStep = 0; recoveryStep == 0 || KillAt(step, recoveryStep); ++recoveryStep)
+      ExpectAsTheLedgerSays(" (killed at step " + std::to_string(step) + ", recovery step " +
+                            std::to_string(recoveryStep) + ")");
+  ExpectAsTheLedgerSays(" (not killed)");
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Operations, CrashSteps,
+    ::testing::Values(Operation{"LoadKeepingOriginals", {}, Clicks("N-A")},
+                      Operation{"LoadOverAnother", {"N-A"}, Clicks("N-B")},
+                      Operation{"UnloadPuttingOriginalsBack", {"N-A"}, Clicks("N-A")},
+                      Operation{"UnloadOfASharedFile", {"N-A", "N-B"}, Clicks("N-A")},
+                      Operation{"LoadOfTheOtherOfALetter", {"S-X"}, Clicks("S-Y")},
+                      Operation{"ResetAll",
+                                {"N-A", "N-B", "S-X"},
+                                [](Selector &selector, Failures &failures) {
+                                  selector.ResetAll(selector.ResetAllFiles(failures), failures);
+                                }}),
+    [](const ::testing::TestParamInfo<Operation> &info) { return std::string(info.param.name); });
