@@ -134,13 +134,14 @@ static void AddCopyFailure(const fs::path &source, const fs::path &target,
 
 // Copies `source` over `target` by way of a temporary file beside it, so that the target is
 // either the old file or the whole new one.
-static bool CopyOver(const fs::path &source, const fs::path &target, Failures &failures) {
+static bool CopyOver(const fs::path &source, const fs::path &target, Failures &failures,
+                     const CopyProgress &progress) {
   const fs::path temporary = PartialPath(target);
-  std::error_code error = CopyToNewFile(source, temporary);
+  std::error_code error = CopyToNewFile(source, temporary, progress);
   if (AlreadyExists(error)) {
     // What an interrupted copy left must not block this one.
     RemovePartial(temporary);
-    error = CopyToNewFile(source, temporary);
+    error = CopyToNewFile(source, temporary, progress);
   }
   if (error) {
     AddCopyFailure(source, target, error, failures);
@@ -168,18 +169,20 @@ static void MakeBothNormal(const fs::path &source, const fs::path &target, Failu
   }
 }
 
-bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures) {
-  if (!CopyOver(source, target, failures))
+bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures,
+                   const CopyProgress &progress) {
+  if (!CopyOver(source, target, failures, progress))
     return false;
   MakeBothNormal(source, target, failures);
   return true;
 }
 
-bool CopyJournaled(const fs::path &source, const fs::path &target, Failures &failures) {
+bool CopyJournaled(const fs::path &source, const fs::path &target, Failures &failures,
+                   const CopyProgress &progress) {
   // Only a file to replace needs the temporary, which costs a rename per file.
-  const std::error_code error = CopyToNewFile(source, target);
+  const std::error_code error = CopyToNewFile(source, target, progress);
   if (AlreadyExists(error))
-    return CopyReplacing(source, target, failures);
+    return CopyReplacing(source, target, failures, progress);
   if (error) {
     AddCopyFailure(source, target, error, failures);
     return false;

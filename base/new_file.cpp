@@ -5,6 +5,7 @@
 
 #include <windows.h>
 #else
+#include <algorithm>
 #include <cerrno>
 #include <fcntl.h>
 #include <sys/sendfile.h>
@@ -13,6 +14,10 @@
 #endif
 
 namespace fs = std::filesystem;
+
+// How much a copy moves between two reports of its progress: a few tenths of a second on a slow
+// disk, nothing to count on a fast one.
+static constexpr std::uint64_t kChunkBytes = 4 << 20;
 
 #ifdef _WIN32
 static std::error_code LastError() {
@@ -38,14 +43,28 @@ std::error_code WriteNewFile(const fs::path &path, const std::string &bytes) {
   return error;
 }
 
-std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
+static DWORD CALLBACK ReportCopied(LARGE_INTEGER size, LARGE_INTEGER copied, LARGE_INTEGER,
+                                   LARGE_INTEGER, DWORD, DWORD, HANDLE, HANDLE, LPVOID data) {
+  if (copied.QuadPart < size.QuadPart)
+    (*static_cast<const CopyProgress *>(data))(static_cast<std::uint64_t>(copied.QuadPart));
+  return PROGRESS_CONTINUE;
+}
+
+std::error_code CopyToNewFile(const fs::path &source, const fs::path &path,
+                              const CopyProgress &progress) {
   std::error_code linkError;
   if (fs::is_symlink(source, linkError))
     return std::make_error_code(std::errc::too_many_symbolic_link_levels);
   // Asked first, so that what a failed copy leaves behind is surely its own to delete.
   if (GetFileAttributesW(path.c_str()) != INVALID_FILE_ATTRIBUTES)
     return std::error_code(ERROR_FILE_EXISTS, std::system_category());
-  if (CopyFileW(source.c_str(), path.c_str(), TRUE))
+  // Windows reports each chunk it copies; a copy without a listener needs no reports.
+  const BOOL copied =
+      progress ? CopyFileExW(source.c_str(), path.c_str(), ReportCopied,
+                             const_cast<CopyProgress *>(&progress), nullptr,
+                             COPY_FILE_FAIL_IF_EXISTS)
+               : CopyFileW(source.c_str(), path.c_str(), TRUE);
+  if (copied)
     return {};
   const std::error_code error = LastError();
   if (!AlreadyExists(error)) {
@@ -88,21 +107,30 @@ std::error_code WriteNewFile(const fs::path &path, const std::string &bytes) {
   return error;
 }
 
-// Copies what is left of `in` into `out`; the kernel moves the bytes where it can.
-static bool CopyContent(int in, int out, off_t size) {
-  while (size > 0) {
-    const ssize_t sent = ::sendfile(out, in, nullptr, static_cast<size_t>(size));
+// Copies what is left of `in` (`size` bytes by its size) into `out`, chunk by chunk, telling
+// `progress` after each chunk but the last; the kernel moves the bytes where it can.
+static bool CopyContent(int in, int out, off_t size, const CopyProgress &progress) {
+  std::uint64_t copied = 0;
+  const auto report = [&] {
+    if (progress && copied < static_cast<std::uint64_t>(size))
+      progress(copied);
+  };
+  while (copied < static_cast<std::uint64_t>(size)) {
+    const std::uint64_t left = static_cast<std::uint64_t>(size) - copied;
+    const ssize_t sent = ::sendfile(out, in, nullptr, static_cast<size_t>(std::min(left, kChunkBytes)));
     if (sent < 0 && errno == EINTR)
       continue;
     if (sent < 0 && (errno == EINVAL || errno == ENOSYS))
       break;
     if (sent <= 0)
       return sent == 0;
-    size -= sent;
-    if (size == 0)
-      return true;
+    copied += static_cast<std::uint64_t>(sent);
+    report();
   }
+  if (size > 0 && copied == static_cast<std::uint64_t>(size))
+    return true;
   char buffer[1 << 16];
+  std::uint64_t reported = copied;
   for (;;) {
     const ssize_t got = ::read(in, buffer, sizeof buffer);
     if (got < 0 && errno == EINTR)
@@ -111,10 +139,16 @@ static bool CopyContent(int in, int out, off_t size) {
       return got == 0;
     if (!WriteAll(out, buffer, static_cast<size_t>(got)))
       return false;
+    copied += static_cast<std::uint64_t>(got);
+    if (copied - reported >= kChunkBytes) {
+      reported = copied;
+      report();
+    }
   }
 }
 
-std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
+std::error_code CopyToNewFile(const fs::path &source, const fs::path &path,
+                              const CopyProgress &progress) {
   const int in = ::open(source.c_str(), O_RDONLY | O_NOFOLLOW | O_CLOEXEC);
   if (in < 0)
     return errno == ELOOP ? std::make_error_code(std::errc::too_many_symbolic_link_levels)
@@ -133,7 +167,7 @@ std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
     return error;
   }
   std::error_code error;
-  if (!CopyContent(in, out, info.st_size))
+  if (!CopyContent(in, out, info.st_size, progress))
     error = LastError();
   if (::close(out) != 0 && !error)
     error = LastError();

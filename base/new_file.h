@@ -1,6 +1,8 @@
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
+#include <functional>
 #include <string>
 #include <system_error>
 
@@ -8,11 +10,15 @@
 // exists, so that a file or link planted there is never written through. Returns the error when
 // that fails.
 std::error_code WriteNewFile(const std::filesystem::path &path, const std::string &bytes);
+// Told during a long copy how many bytes of the file are copied so far.
+using CopyProgress = std::function<void(std::uint64_t copied)>;
 // Copies the file `source` into the new file `path`, created the same way; a source that is a link
-// is refused. Returns the error when that fails; a file it created is then deleted again, so that
-// nothing half-written stays.
+// is refused. A file larger than a chunk is copied chunk by chunk, and `progress` (when set) is
+// told after each chunk but the last. Returns the error when that fails; a file it created is then
+// deleted again, so that nothing half-written stays.
 std::error_code CopyToNewFile(const std::filesystem::path &source,
-                              const std::filesystem::path &path);
+                              const std::filesystem::path &path,
+                              const CopyProgress &progress = {});
 // Whether `error` says that an entry of that name is already there.
 bool AlreadyExists(const std::error_code &error);
 // The reason of `error` for a message: "the disk is full" when it is, else the system's words.

@@ -5,6 +5,7 @@
 #include "base/file_remover.h"
 #include "base/listing.h"
 #include "base/names.h"
+#include "base/progress_meter.h"
 #include "base/text_file.h"
 #include "library/game_places.h"
 #include "library/keeping.h"
@@ -43,10 +44,11 @@ std::vector<std::string> CleanUpNames(const LibraryState &state, Failures &failu
 int DeleteFiles(const fs::path &folder, const std::vector<std::string> &names, Caption &caption,
                 Failures &failures) {
   FileRemover remover(folder);
+  ProgressMeter meter(caption, static_cast<int>(names.size()));
   int deleted = 0;
-  for (size_t done = 0; done < names.size(); ++done) {
-    caption.Progress(static_cast<int>(done + 1), static_cast<int>(names.size()));
-    deleted += remover.Remove(names[done], failures) ? 1 : 0;
+  for (const std::string &name : names) {
+    meter.NextFile("Please wait... cleaning up");
+    deleted += remover.Remove(name, failures) ? 1 : 0;
   }
   return deleted;
 }

@@ -71,3 +71,10 @@ bool ConfirmDeletion(QWidget *parent, const std::vector<std::string> &names) {
   delete box;
   return agreed;
 }
+
+bool Confirm(QWidget *parent, const QString &question) {
+  QMessageBox box(QMessageBox::Question, WindowCaptionText().simplified(), question,
+                  QMessageBox::Ok | QMessageBox::Cancel, parent);
+  box.setDefaultButton(QMessageBox::Cancel);
+  return box.exec() == QMessageBox::Ok;
+}

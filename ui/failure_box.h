@@ -15,3 +15,5 @@ void ShowNotice(QWidget *parent, const std::string &notice);
 // Asks before files are deleted: a box with their number, the first names and the whole list
 // under "Show Details". True when the user chose OK.
 bool ConfirmDeletion(QWidget *parent, const std::vector<std::string> &names);
+// Asks `question` in a box over `parent` with OK and Cancel, Cancel the default. True for OK.
+bool Confirm(QWidget *parent, const QString &question);
