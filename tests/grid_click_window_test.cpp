@@ -118,6 +118,7 @@ TEST(GridClickWindow, FlightModelShowsItsPlaneSetsUntilUnloaded) {
   QTest::mouseMove(driver.Find<QWidget>("LoadFrame"), QPoint(150, 4));
   EXPECT_TRUE(panel->isVisible());
   driver.ClickRow(2);
+  EXPECT_EQ(Mark(driver, 2), "S");
   EXPECT_FALSE(panel->isVisible());
 }
 
