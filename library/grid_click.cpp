@@ -1,6 +1,7 @@
 #include "library/grid_click.h"
 
 #include "base/existence.h"
+#include "base/text_encoding.h"
 #include "library/keeping.h"
 #include "library/loaded_record.h"
 #include "library/move_in.h"
@@ -33,10 +34,10 @@ int FirstLoaded(const FolderGrid &grid, char letter) {
   return 0;
 }
 
-// The last loaded row of `letter`, or 0.
-int LastLoaded(const FolderGrid &grid, char letter) {
+// The last loaded row whose first character is `letter`, or 0.
+int LastLoaded(const FolderGrid &grid, const std::string &letter) {
   for (int row = grid.RowCount() - 1; row >= 1; --row)
-    if (IsLoaded(grid.Row(row)) && Letter(grid.Row(row)) == letter)
+    if (IsLoaded(grid.Row(row)) && FirstCharacterOf(grid.Row(row).name).text == letter)
       return row;
   return 0;
 }
@@ -101,7 +102,9 @@ std::vector<std::string> ClickOther(LibraryState &state, int clicked, Caption &c
     SaveLoaded(state, failures);
     return {};
   }
-  const int other = AllowsSeveralLoaded(letter) ? 0 : LastLoaded(state.Unigrid, letter);
+  const int other = AllowsSeveralLoaded(letter)
+                        ? 0
+                        : LastLoaded(state.Unigrid, FirstCharacterOf(state.Unigrid.Row(clicked).name).text);
   if (other != 0) {
     if (letter == kFlightModel)
       state.Slots.frameVisible = false;
