@@ -96,7 +96,7 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
   RemovePartial(temporary);
   error = WriteNewFile(temporary, bytes);
   if (error) {
-    failures.Add(target, "cannot be written (" + ReasonOf(error) + ")");
+    failures.Add(target, "cannot be written (" + ReasonFor(target, error) + ")");
     RemovePartial(temporary);
     return false;
   }
@@ -111,7 +111,7 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
   }
   fs::rename(temporary, target, error);
   if (error) {
-    failures.Add(target, "cannot be replaced (" + error.message() + ")");
+    failures.Add(target, "cannot be replaced (" + ReasonFor(target, error) + ")");
     RemovePartial(temporary);
     if (before)
       fs::permissions(target, *before, error);
@@ -129,7 +129,8 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
 
 static void AddCopyFailure(const fs::path &source, const fs::path &target,
                            const std::error_code &error, Failures &failures) {
-  failures.Add(source, "cannot be copied to " + DisplayPath(target) + " (" + ReasonOf(error) + ")");
+  failures.Add(source,
+               "cannot be copied to " + DisplayPath(target) + " (" + ReasonFor(target, error) + ")");
 }
 
 // Copies `source` over `target` by way of a temporary file beside it, so that the target is
@@ -154,7 +155,7 @@ static bool CopyOver(const fs::path &source, const fs::path &target, Failures &f
 #endif
   fs::rename(temporary, target, error);
   if (error) {
-    failures.Add(target, "cannot be replaced (" + error.message() + ")");
+    failures.Add(target, "cannot be replaced (" + ReasonFor(target, error) + ")");
     RemovePartial(temporary);
     return false;
   }
@@ -215,6 +216,6 @@ bool RemoveFile(const fs::path &path, Failures &failures, const std::string &pro
   if (restore != INVALID_FILE_ATTRIBUTES)
     SetFileAttributesW(path.c_str(), restore);
 #endif
-  failures.Add(path, problem + " (" + error.message() + ")");
+  failures.Add(path, problem + " (" + ReasonFor(path, error) + ")");
   return false;
 }

@@ -1,5 +1,7 @@
 #include "base/new_file.h"
 
+#include "base/names.h"
+
 #ifdef _WIN32
 #include <algorithm>
 
@@ -197,5 +199,38 @@ std::string ReasonOf(const std::error_code &error) {
 #endif
   if (error == std::errc::too_many_symbolic_link_levels)
     return "it is a link, and the program does not follow links";
+#ifdef _WIN32
+  // The program makes every file writable before it changes it: what is still refused is held
+  // open by another program.
+  if (error == std::errc::permission_denied ||
+      (error.category() == std::system_category() &&
+       (error.value() == ERROR_SHARING_VIOLATION || error.value() == ERROR_LOCK_VIOLATION)))
+    return "in use by another program (is the game running?)";
+#endif
   return error.message();
+}
+
+std::string WindowsNameProblem(std::string_view name) {
+  if (!name.empty() && (name.back() == '.' || name.back() == ' '))
+    return "a name Windows cannot keep (it ends in a dot or blank)";
+  // A device name is one whatever extension follows it, and with blanks before the extension.
+  std::string stem(name.substr(0, name.find('.')));
+  while (!stem.empty() && stem.back() == ' ')
+    stem.pop_back();
+  for (char &c : stem)
+    c = static_cast<char>(c >= 'a' && c <= 'z' ? c - 'a' + 'A' : c);
+  const bool numbered = stem.size() == 4 && (stem.rfind("COM", 0) == 0 || stem.rfind("LPT", 0) == 0) &&
+                        stem[3] >= '1' && stem[3] <= '9';
+  if (numbered || stem == "CON" || stem == "PRN" || stem == "AUX" || stem == "NUL")
+    return "a name Windows reserves for a device";
+  return "";
+}
+
+std::string ReasonFor([[maybe_unused]] const fs::path &path, const std::error_code &error) {
+#ifdef _WIN32
+  const std::string problem = WindowsNameProblem(NameText(path));
+  if (!problem.empty())
+    return problem;
+#endif
+  return ReasonOf(error);
 }

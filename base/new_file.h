@@ -4,6 +4,7 @@
 #include <filesystem>
 #include <functional>
 #include <string>
+#include <string_view>
 #include <system_error>
 
 // Writes `bytes` into the new file `path`. The file is created only when no entry of that name
@@ -21,5 +22,12 @@ std::error_code CopyToNewFile(const std::filesystem::path &source,
                               const CopyProgress &progress = {});
 // Whether `error` says that an entry of that name is already there.
 bool AlreadyExists(const std::error_code &error);
-// The reason of `error` for a message: "the disk is full" when it is, else the system's words.
+// The reason of `error` for a message: "the disk is full" when it is, on Windows "in use by
+// another program (is the game running?)" for a file held open, else the system's words.
 std::string ReasonOf(const std::error_code &error);
+// What Windows makes of the name `name`: "a name Windows reserves for a device" (CON, nul.txt),
+// "a name Windows cannot keep (it ends in a dot or blank)", or empty for a name it keeps.
+std::string WindowsNameProblem(std::string_view name);
+// The reason of `error` about the file `path` for a message: on Windows, whose errors for such
+// names say nothing to the point, a name it cannot keep; else ReasonOf.
+std::string ReasonFor(const std::filesystem::path &path, const std::error_code &error);

@@ -1,6 +1,7 @@
 #include "library/grid_click.h"
 
 #include "base/existence.h"
+#include "base/new_file.h"
 #include "base/text_encoding.h"
 #include "library/keeping.h"
 #include "library/loaded_record.h"
@@ -129,6 +130,12 @@ std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption
   if (state.Ready && !IsLoaded(clicked)) {
     const fs::path folder = state.Unigrid.PathOf(row);
     FolderCheck(folder);
+    // Windows lists a folder whose name it cannot keep, but finds no folder of that name.
+    const std::string odd = WindowsNameProblem(clicked.name);
+    if (!FolderFound && !odd.empty()) {
+      failures.Add(folder, "cannot be loaded: it has " + odd);
+      return {};
+    }
     if (!FolderFound) {
       failures.Add(folder, "is no longer in the library, so nothing was loaded "
                            "(\"Refresh!\" shows the library as it is now)");
