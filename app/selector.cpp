@@ -110,8 +110,9 @@ static std::string RefreshSummary(const std::set<std::string> &before,
       count += in.count(name) == 0 ? 1 : 0;
     return std::to_string(count);
   };
-  return "Refresh: " + std::to_string(after.size()) + (after.size() == 1 ? " folder, " : " folders, ") +
-         missingFrom(after, before) + " new, " + missingFrom(before, after) + " gone";
+  return "Refresh: " + std::to_string(after.size()) +
+         (after.size() == 1 ? " folder, " : " folders, ") + missingFrom(after, before) + " new, " +
+         missingFrom(before, after) + " gone";
 }
 
 void Selector::RefreshLibrary(Failures &failures) {
@@ -153,9 +154,9 @@ IniValues Selector::ReadSettings(Failures &failures) {
 
 void Selector::SaveSettings(const IniTexts &texts, Failures &failures) {
   const int saved = inisave(state_.EAWDir, state_.Ready, texts, failures);
-  state_.summary = saved < 0 ? "" : std::to_string(saved) +
-                                        (saved == 1 ? " setting" : " settings") +
-                                        " saved to eaw.ini";
+  state_.summary = saved < 0 ? ""
+                             : std::to_string(saved) + (saved == 1 ? " setting" : " settings") +
+                                   " saved to eaw.ini";
 }
 
 std::string Selector::SettingsFileText(Failures &failures) {

@@ -129,8 +129,8 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
 
 static void AddCopyFailure(const fs::path &source, const fs::path &target,
                            const std::error_code &error, Failures &failures) {
-  failures.Add(source,
-               "cannot be copied to " + DisplayPath(target) + " (" + ReasonFor(target, error) + ")");
+  failures.Add(source, "cannot be copied to " + DisplayPath(target) + " (" +
+                           ReasonFor(target, error) + ")");
 }
 
 // Copies `source` over `target` by way of a temporary file beside it, so that the target is

@@ -61,11 +61,10 @@ std::error_code CopyToNewFile(const fs::path &source, const fs::path &path,
   if (GetFileAttributesW(path.c_str()) != INVALID_FILE_ATTRIBUTES)
     return std::error_code(ERROR_FILE_EXISTS, std::system_category());
   // Windows reports each chunk it copies; a copy without a listener needs no reports.
-  const BOOL copied =
-      progress ? CopyFileExW(source.c_str(), path.c_str(), ReportCopied,
-                             const_cast<CopyProgress *>(&progress), nullptr,
-                             COPY_FILE_FAIL_IF_EXISTS)
-               : CopyFileW(source.c_str(), path.c_str(), TRUE);
+  const BOOL copied = progress ? CopyFileExW(source.c_str(), path.c_str(), ReportCopied,
+                                             const_cast<CopyProgress *>(&progress), nullptr,
+                                             COPY_FILE_FAIL_IF_EXISTS)
+                               : CopyFileW(source.c_str(), path.c_str(), TRUE);
   if (copied)
     return {};
   const std::error_code error = LastError();
@@ -119,7 +118,8 @@ static bool CopyContent(int in, int out, off_t size, const CopyProgress &progres
   };
   while (copied < static_cast<std::uint64_t>(size)) {
     const std::uint64_t left = static_cast<std::uint64_t>(size) - copied;
-    const ssize_t sent = ::sendfile(out, in, nullptr, static_cast<size_t>(std::min(left, kChunkBytes)));
+    const ssize_t sent =
+        ::sendfile(out, in, nullptr, static_cast<size_t>(std::min(left, kChunkBytes)));
     if (sent < 0 && errno == EINTR)
       continue;
     if (sent < 0 && (errno == EINVAL || errno == ENOSYS))
@@ -219,7 +219,8 @@ std::string WindowsNameProblem(std::string_view name) {
     stem.pop_back();
   for (char &c : stem)
     c = static_cast<char>(c >= 'a' && c <= 'z' ? c - 'a' + 'A' : c);
-  const bool numbered = stem.size() == 4 && (stem.rfind("COM", 0) == 0 || stem.rfind("LPT", 0) == 0) &&
+  const bool numbered = stem.size() == 4 &&
+                        (stem.rfind("COM", 0) == 0 || stem.rfind("LPT", 0) == 0) &&
                         stem[3] >= '1' && stem[3] <= '9';
   if (numbered || stem == "CON" || stem == "PRN" || stem == "AUX" || stem == "NUL")
     return "a name Windows reserves for a device";

@@ -18,8 +18,7 @@ using CopyProgress = std::function<void(std::uint64_t copied)>;
 // told after each chunk but the last. Returns the error when that fails; a file it created is then
 // deleted again, so that nothing half-written stays.
 std::error_code CopyToNewFile(const std::filesystem::path &source,
-                              const std::filesystem::path &path,
-                              const CopyProgress &progress = {});
+                              const std::filesystem::path &path, const CopyProgress &progress = {});
 // Whether `error` says that an entry of that name is already there.
 bool AlreadyExists(const std::error_code &error);
 // The reason of `error` for a message: "the disk is full" when it is, on Windows "in use by

@@ -31,7 +31,7 @@ void ProgressMeter::ShowNowAndThen() {
   if (now < due_)
     return;
   due_ = now + interval_;
-  caption_.Set(doing_ + *name_ + " (" + std::to_string(figures_.done) +
-               " of " + std::to_string(figures_.total) + ")");
+  caption_.Set(doing_ + *name_ + " (" + std::to_string(figures_.done) + " of " +
+               std::to_string(figures_.total) + ")");
   caption_.Progress(figures_);
 }

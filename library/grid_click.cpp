@@ -103,9 +103,10 @@ std::vector<std::string> ClickOther(LibraryState &state, int clicked, Caption &c
     SaveLoaded(state, failures);
     return {};
   }
-  const int other = AllowsSeveralLoaded(letter)
-                        ? 0
-                        : LastLoaded(state.Unigrid, FirstCharacterOf(state.Unigrid.Row(clicked).name).text);
+  const int other =
+      AllowsSeveralLoaded(letter)
+          ? 0
+          : LastLoaded(state.Unigrid, FirstCharacterOf(state.Unigrid.Row(clicked).name).text);
   if (other != 0) {
     if (letter == kFlightModel)
       state.Slots.frameVisible = false;

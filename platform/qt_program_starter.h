@@ -23,5 +23,4 @@ public:
 private:
   std::function<void(const QString &, const QString &)> told_;
   QObject alive_; // ends the hearing when this starter goes
-
 };

@@ -33,4 +33,4 @@ std::string RewrittenIni(const std::vector<std::string> &lines, const IniTexts &
 // false or when the file is missing; a read-only file is written and left writable. Returns how
 // many of the keys the file holds, or -1 when it was not written.
 int inisave(const std::filesystem::path &eawDir, bool ready, const IniTexts &texts,
-             Failures &failures);
+            Failures &failures);

@@ -30,7 +30,8 @@ static bool Rename(const fs::path &from, const fs::path &to, Failures &failures)
   std::error_code error;
   fs::rename(from, to, error);
   if (error)
-    failures.Add(from, "cannot be renamed to " + DisplayPath(to) + " (" + ReasonFor(from, error) + ")");
+    failures.Add(from,
+                 "cannot be renamed to " + DisplayPath(to) + " (" + ReasonFor(from, error) + ")");
   return !error;
 }
 

@@ -213,9 +213,10 @@ TEST(FeedbackWindow, TheEditorFollowsTheBoxesAndAsksBeforeSavingOverAChange) {
   enter("Text6", "768");
   EXPECT_EQ(text->toPlainText(), "Width=1024\nHeight=600\nExtra=1\n");
   auto *save = driver.Find<QPushButton>("InSaver");
-  EXPECT_EQ(driver.AnswerNextBox(QMessageBox::Cancel, [&] { QTest::mouseClick(save, Qt::LeftButton); }),
-            "eaw.ini has changed since the editor showed it (Height). Save the editor's text over "
-            "it?");
+  EXPECT_EQ(
+      driver.AnswerNextBox(QMessageBox::Cancel, [&] { QTest::mouseClick(save, Qt::LeftButton); }),
+      "eaw.ini has changed since the editor showed it (Height). Save the editor's text over "
+      "it?");
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1024\r\nHeight=768\r\n");
   driver.AnswerNextBox(QMessageBox::Ok, [&] { QTest::mouseClick(save, Qt::LeftButton); });
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1024\r\nHeight=600\r\nExtra=1\r\n\r\n");

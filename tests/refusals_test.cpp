@@ -59,9 +59,9 @@ TEST(Reasons, AFullDiskAHeldFileAndNamesWindowsCannotKeepAreCalledSo) {
   const std::string device = "a name Windows reserves for a device";
   const std::string dotted = "a name Windows cannot keep (it ends in a dot or blank)";
   const std::pair<const char *, std::string> names[] = {
-      {"CON", device},   {"nul.txt", device}, {"Com1.dat", device}, {"lpt9 .x", device},
-      {"aux", device},   {"CONSOLE", ""},     {"COM10", ""},        {"COM0", ""},
-      {"mission.", dotted}, {"mission ", dotted}, {"plain.dat", ""}, {".hidden", ""}};
+      {"CON", device},      {"nul.txt", device},  {"Com1.dat", device}, {"lpt9 .x", device},
+      {"aux", device},      {"CONSOLE", ""},      {"COM10", ""},        {"COM0", ""},
+      {"mission.", dotted}, {"mission ", dotted}, {"plain.dat", ""},    {".hidden", ""}};
   for (const auto &[name, problem] : names)
     EXPECT_EQ(WindowsNameProblem(name), problem) << name;
 

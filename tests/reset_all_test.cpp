@@ -50,11 +50,11 @@ TEST_F(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
     EXPECT_TRUE(game.Exists("ZEP128/FoldersLoaded.txt"));
     EXPECT_EQ(game.Record(), "");
   }
-  EXPECT_EQ(caption.shown, (Names{"Please wait... cleaning up", "Please wait... cleaning up (1 of 4)",
-                                  "Please wait... cleaning up (2 of 4)",
-                                  "Please wait... cleaning up (3 of 4)",
-                                  "Please wait... cleaning up (4 of 4)", "Selector",
-                                  "Please wait... cleaning up", "Selector"}));
+  EXPECT_EQ(caption.shown,
+            (Names{"Please wait... cleaning up", "Please wait... cleaning up (1 of 4)",
+                   "Please wait... cleaning up (2 of 4)", "Please wait... cleaning up (3 of 4)",
+                   "Please wait... cleaning up (4 of 4)", "Selector", "Please wait... cleaning up",
+                   "Selector"}));
   EXPECT_TRUE(state.Ready);
   EXPECT_EQ(state.Unigrid.rows[1].mark, "");
   EXPECT_EQ(state.Unigrid.rows[1].nameColour, 0xFFFFFFu);

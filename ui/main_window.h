@@ -67,6 +67,6 @@ private:
   std::string currentMusic_;       // the music set Label11 shows, byte for byte
   QString typed_;                  // letters typed into the grid in quick succession
   QElapsedTimer typedSince_;
-  HeldKey enterHeld_;            // Enter on the grid acts once however long it is held
-  bool label33Pressed_ = false;  // "Refresh!" acts on the release of a press it saw
+  HeldKey enterHeld_;           // Enter on the grid acts once however long it is held
+  bool label33Pressed_ = false; // "Refresh!" acts on the release of a press it saw
 };
