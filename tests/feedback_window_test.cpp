@@ -6,7 +6,6 @@
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QPlainTextEdit>
-#include <QRegularExpression>
 #include <QTest>
 #include <gtest/gtest.h>
 
@@ -120,7 +119,6 @@ TEST(FeedbackWindow, ABigFileShowsItsBytesInTheLineAndTheFileCountInTheCaption) 
   GameFolder game;
   game.WithGameFolders().WithCategories("Singles: Q\r\n");
   game.Write("ZEP128/Q-Big/big.dat", std::string(9 << 20, 'x'));
-  game.Write("ZEP128/Q-Big/small.dat");
   WindowDriver driver(game.Path());
   const QString caption = driver.Window().windowTitle();
   QStringList lines, captions;
@@ -131,23 +129,16 @@ TEST(FeedbackWindow, ABigFileShowsItsBytesInTheLineAndTheFileCountInTheCaption) 
                    });
   driver.ClickRow(1);
   ASSERT_FALSE(lines.isEmpty());
-  EXPECT_TRUE(QRegularExpression("^Please wait: [12] of 2 files, [0-9.]+ of 9\\.0 MB$")
-                  .match(lines[0])
-                  .hasMatch())
-      << lines[0].toStdString();
-  EXPECT_TRUE(QRegularExpression("^Please wait- copying: :(big|small)\\.dat \\([12] of 2\\)$")
-                  .match(captions[0])
-                  .hasMatch())
-      << captions[0].toStdString();
+  EXPECT_EQ(lines[0], "Please wait: 1 of 1 files, 0.0 of 9.0 MB");
+  EXPECT_EQ(captions[0], "Please wait- copying: :big.dat (1 of 1)");
   EXPECT_EQ(driver.Window().windowTitle(), caption);
-  EXPECT_EQ(Summary(driver), "Loaded \"Q-Big\": 2 files copied.");
+  EXPECT_EQ(Summary(driver), "Loaded \"Q-Big\": 1 file copied.");
 }
 
 TEST(FeedbackWindow, AStartThatFinishedAnInterruptedUnloadShowsTheInstructions) {
   GameFolder game;
   game.WithCategories("Sounds: N\r\n");
-  game.Write("ZEP128/N-A/a.dat");
-  game.Write("ZEP128/N-A/b.dat");
+  game.Addon("N-A", {"a.dat", "b.dat"});
   game.Write("a.dat");
   game.Write("b.dat");
   game.Write("ZEP128/#Selector/journal.txt", "unload\r\nN-A\r\n\tG-a.dat\r\n\tG-b.dat\r\n");

@@ -11,13 +11,7 @@ chmod +x "$stubs"/*
 script="$(dirname "$0")/../scripts/install_deps.sh"
 demo=$(PATH="$stubs:$PATH" bash "$script" demo)
 test=$(PATH="$stubs:$PATH" bash "$script" test)
-[ "$demo" = "cmake g++ make qt6-base-dev fonts-liberation2" ] || {
-  echo "the demo installs: $demo"
-  exit 1
-}
+[ "$demo" = "cmake g++ make qt6-base-dev fonts-liberation2" ] || { echo "demo: $demo" && exit 1; }
 for p in cmake qt6-base-dev libgtest-dev xvfb g++-mingw-w64-x86-64-posix wine64; do
-  [[ " $test " == *" $p "* ]] || {
-    echo "the tests do not install $p: $test"
-    exit 1
-  }
+  [[ " $test " == *" $p "* ]] || { echo "tests lack $p: $test" && exit 1; }
 done
