@@ -3,6 +3,7 @@
 #include "base/existence.h"
 #include "base/file_ops.h"
 #include "base/names.h"
+#include "base/text_encoding.h"
 #include "base/text_file.h"
 
 namespace fs = std::filesystem;
@@ -62,7 +63,7 @@ Categories ParseCategories(const std::vector<std::string> &lines) {
       continue;
     }
     categories.descriptions.push_back(line.substr(0, colon));
-    categories.codes.push_back(line.substr(line.size() - 1));
+    categories.codes.push_back(LastCharacterOf(line));
   }
   return categories;
 }

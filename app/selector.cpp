@@ -17,6 +17,8 @@
 #include "settings/ini_editor.h"
 #include "settings/music_switch.h"
 
+#include <set>
+
 namespace fs = std::filesystem;
 
 Selector::Selector(const fs::path &eawDir, Caption &caption, ProgramStarter &starter)
@@ -45,6 +47,8 @@ void Selector::StartUp(Failures &failures) {
 }
 
 std::string Selector::ShowCategory(int entry) {
+  if (entry >= 0)
+    state_.shownCategory = entry;
   return ::ShowCategory(state_.Unigrid, state_.Codes, entry);
 }
 
@@ -107,7 +111,30 @@ std::string Selector::PressKey(int row, int key, Failures &failures) {
   return key == kEnterKey ? ClickRow(row, failures) : "";
 }
 
+// The names of the grid's folders, each once (a letter listed twice shows its folders twice).
+static std::set<std::string> FolderNames(const FolderGrid &grid) {
+  std::set<std::string> names;
+  for (int row = 1; row < grid.RowCount(); ++row)
+    names.insert(grid.Row(row).name);
+  return names;
+}
+
+// "Refresh: 212 folders, 3 new, 1 gone".
+static std::string RefreshSummary(const std::set<std::string> &before,
+                                  const std::set<std::string> &after) {
+  const auto missingFrom = [](const std::set<std::string> &some, const std::set<std::string> &in) {
+    size_t count = 0;
+    for (const std::string &name : some)
+      count += in.count(name) == 0 ? 1 : 0;
+    return std::to_string(count);
+  };
+  return "Refresh: " + std::to_string(after.size()) +
+         (after.size() == 1 ? " folder, " : " folders, ") + missingFrom(after, before) + " new, " +
+         missingFrom(before, after) + " gone";
+}
+
 void Selector::RefreshLibrary(Failures &failures) {
+  const std::set<std::string> before = FolderNames(state_.Unigrid);
   state_.Ready = false;
   // Start-up writes both files when missing; a rebuild needs them just the same.
   EnsureCategoryFile(state_.LibDir, failures);
@@ -116,7 +143,9 @@ void Selector::RefreshLibrary(Failures &failures) {
   ReplayRecord(state_, caption_, failures);
   // The rows under the pointer are other folders now, so the next move rebuilds the preview.
   state_.HoverRow = -1;
+  ShowCategory(state_.shownCategory);
   state_.Ready = true;
+  state_.summary = RefreshSummary(before, FolderNames(state_.Unigrid));
 }
 
 std::vector<std::string> Selector::ResetAllFiles(Failures &failures) const {
@@ -153,25 +182,40 @@ IniValues Selector::ReadSettings(Failures &failures) {
 }
 
 void Selector::SaveSettings(const IniTexts &texts, Failures &failures) {
-  inisave(state_.EAWDir, state_.Ready, texts, failures);
+  const int saved = inisave(state_.EAWDir, state_.Ready, texts, failures);
+  state_.summary = saved < 0 ? ""
+                             : std::to_string(saved) + (saved == 1 ? " setting" : " settings") +
+                                   " saved to eaw.ini";
 }
 
 std::string Selector::SettingsFileText(Failures &failures) {
   return IniDisplayText(state_.EAWDir, failures);
 }
 
+std::vector<std::string> Selector::ChangedSettings(const std::string &before,
+                                                   const std::string &after) const {
+  return ChangedKeys(before, after);
+}
+
 bool Selector::SaveSettingsFile(const std::string &text, Failures &failures) {
-  return IniEditorSave(state_.EAWDir, text, failures);
+  const bool saved = IniEditorSave(state_.EAWDir, text, failures);
+  state_.summary = saved ? "eaw.ini saved" : "";
+  return saved;
 }
 
 MusicList Selector::MusicSets(Failures &failures) { return FillMusicList(state_.EAWDir, failures); }
 
 bool Selector::SwitchMusic(const std::string &activeName, const std::string &chosenName,
                            Failures &failures) {
-  return ::SwitchMusic(state_.EAWDir, activeName, chosenName, MusicJournal(), failures);
+  const bool switched =
+      ::SwitchMusic(state_.EAWDir, activeName, chosenName, MusicJournal(), failures);
+  state_.summary = switched ? "Music set " + chosenName + " is playing" : "";
+  return switched;
 }
 
-void Selector::StartGame(Failures &failures) { ::StartGame(state_.EAWDir, starter_, failures); }
+void Selector::StartGame(Failures &failures) {
+  state_.summary = ::StartGame(state_.EAWDir, starter_, failures) ? "Game started" : "";
+}
 
 fs::path Selector::MusicJournal() const { return KeepingFolder(state_.LibDir) / "music.txt"; }
 

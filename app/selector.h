@@ -40,7 +40,8 @@ public:
   int FindRow(int from, const std::string &prefix) const {
     return state_.Unigrid.FindShownRow(from, prefix);
   }
-  // Rebuilds the grid from the library on disk, keeping the loaded marks.
+  // Rebuilds the grid from the library on disk, keeping the loaded marks and the category shown;
+  // the summary counts the folders, the new and the gone ones.
   void RefreshLibrary(Failures &failures);
   // The game-folder files that Reset All would delete besides the loaded folders' copies, for the
   // player to agree to.
@@ -53,20 +54,26 @@ public:
   // The preview of grid row `row` when the pointer has entered it; nothing when it was already
   // over that row.
   std::optional<FolderPreview> HoverRow(int row);
+  // The pointer left the grid and the preview was cleared: the next row entered shows again.
+  void LeaveGrid() { state_.HoverRow = -1; }
   // The six settings of eaw.ini as the boxes show them.
   IniValues ReadSettings(Failures &failures);
-  // Writes the six box texts into eaw.ini.
+  // Writes the six box texts into eaw.ini; the summary says how many were saved.
   void SaveSettings(const IniTexts &texts, Failures &failures);
   // The whole of eaw.ini for the editor.
   std::string SettingsFileText(Failures &failures);
-  // Saves the editor's text as eaw.ini; true when it was written.
+  // The settings keys whose lines differ between two texts of eaw.ini.
+  std::vector<std::string> ChangedSettings(const std::string &before,
+                                           const std::string &after) const;
+  // Saves the editor's text as eaw.ini; true when it was written, and then said in the summary.
   bool SaveSettingsFile(const std::string &text, Failures &failures);
   // The music sets of Music.ini.
   MusicList MusicSets(Failures &failures);
-  // Makes `chosenName` the game's music in place of `activeName`; true when switched.
+  // Makes `chosenName` the game's music in place of `activeName`; true when switched, and then
+  // said in the summary.
   bool SwitchMusic(const std::string &activeName, const std::string &chosenName,
                    Failures &failures);
-  // Starts the game.
+  // Starts the game; the summary says when it was started.
   void StartGame(Failures &failures);
 
   // The loaded folders in the order they were loaded.

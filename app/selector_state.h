@@ -13,5 +13,6 @@ struct SelectorState : LibraryState {
   std::filesystem::path BackPic;  // empty when there is no background picture
   std::filesystem::path NewPic;   // the General Settings page's picture; empty for none
   int HoverRow = -1;
-  std::string summary; // the line that sums up the last load, unload or Reset All
+  int shownCategory = 0; // the category list entry the grid shows
+  std::string summary;   // the line that sums up the last action; empty for none
 };

@@ -1,6 +1,16 @@
 #pragma once
 
+#include <chrono>
+#include <cstdint>
 #include <string>
+
+// How far a long file operation is.
+struct ProgressFigures {
+  int done = 0; // files begun, of `total`
+  int total = 0;
+  std::uint64_t bytesDone = 0; // bytes copied, of `bytesTotal`; 0 of 0 where nothing is copied
+  std::uint64_t bytesTotal = 0;
+};
 
 // The main window's caption, which long file operations use as their progress line.
 class Caption {
@@ -8,9 +18,13 @@ public:
   virtual ~Caption() = default;
   virtual std::string Get() const = 0;
   virtual void Set(const std::string &text) = 0;
-  // How far a long operation is: file `done` of `total`. Shown beside the caption, whose text
-  // stays as it is; a caption that cannot show it ignores it.
-  virtual void Progress(int /*done*/, int /*total*/) {}
+  // How far a long operation is, shown beside the caption; a caption that cannot show it
+  // ignores it.
+  virtual void Progress(const ProgressFigures & /*figures*/) {}
+  // How long an operation waits at least between two updates of the caption and the progress.
+  virtual std::chrono::milliseconds ProgressInterval() const {
+    return std::chrono::milliseconds(100);
+  }
 };
 
 // A caption with no window to show it: keeps its text only, for the core run headless.

@@ -144,7 +144,7 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
   RemovePartial(temporary);
   error = WriteNewFile(temporary, bytes);
   if (error) {
-    failures.Add(target, "cannot be written (" + ReasonOf(error) + ")");
+    failures.Add(target, "cannot be written (" + ReasonFor(target, error) + ")");
     RemovePartial(temporary);
     return false;
   }
@@ -159,7 +159,7 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
   }
   error = RenameDurably(temporary, target);
   if (error) {
-    failures.Add(target, "cannot be replaced (" + error.message() + ")");
+    failures.Add(target, "cannot be replaced (" + ReasonFor(target, error) + ")");
     RemovePartial(temporary);
     if (before)
       fs::permissions(target, *before, error);
@@ -178,18 +178,20 @@ bool WriteAtomically(const fs::path &target, const std::string &bytes, Failures 
 
 static void AddCopyFailure(const fs::path &source, const fs::path &target,
                            const std::error_code &error, Failures &failures) {
-  failures.Add(source, "cannot be copied to " + DisplayPath(target) + " (" + ReasonOf(error) + ")");
+  failures.Add(source, "cannot be copied to " + DisplayPath(target) + " (" +
+                           ReasonFor(target, error) + ")");
 }
 
 // Copies `source` over `target` by way of a temporary file beside it, so that the target is
 // either the old file or the whole new one.
-static bool CopyOver(const fs::path &source, const fs::path &target, Failures &failures) {
+static bool CopyOver(const fs::path &source, const fs::path &target, Failures &failures,
+                     const CopyProgress &progress) {
   const fs::path temporary = PartialPath(target);
-  std::error_code error = CopyToNewFile(source, temporary);
+  std::error_code error = CopyToNewFile(source, temporary, progress);
   if (AlreadyExists(error)) {
     // What an interrupted copy left must not block this one.
     RemovePartial(temporary);
-    error = CopyToNewFile(source, temporary);
+    error = CopyToNewFile(source, temporary, progress);
   }
   if (error) {
     AddCopyFailure(source, target, error, failures);
@@ -203,7 +205,7 @@ static bool CopyOver(const fs::path &source, const fs::path &target, Failures &f
 #endif
   fs::rename(temporary, target, error);
   if (error) {
-    failures.Add(target, "cannot be replaced (" + error.message() + ")");
+    failures.Add(target, "cannot be replaced (" + ReasonFor(target, error) + ")");
     RemovePartial(temporary);
     return false;
   }
@@ -219,18 +221,20 @@ static void MakeBothNormal(const fs::path &source, const fs::path &target, Failu
   }
 }
 
-bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures) {
-  if (!CopyOver(source, target, failures))
+bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures,
+                   const CopyProgress &progress) {
+  if (!CopyOver(source, target, failures, progress))
     return false;
   MakeBothNormal(source, target, failures);
   return true;
 }
 
-bool CopyJournaled(const fs::path &source, const fs::path &target, Failures &failures) {
+bool CopyJournaled(const fs::path &source, const fs::path &target, Failures &failures,
+                   const CopyProgress &progress) {
   // Only a file to replace needs the temporary, which costs a rename per file.
-  const std::error_code error = CopyToNewFile(source, target);
+  const std::error_code error = CopyToNewFile(source, target, progress);
   if (AlreadyExists(error))
-    return CopyReplacing(source, target, failures);
+    return CopyReplacing(source, target, failures, progress);
   if (error) {
     AddCopyFailure(source, target, error, failures);
     return false;
@@ -267,6 +271,6 @@ bool RemoveFile(const fs::path &path, Failures &failures, const std::string &pro
   if (restore != INVALID_FILE_ATTRIBUTES)
     SetFileAttributesW(path.c_str(), restore);
 #endif
-  failures.Add(path, problem + " (" + error.message() + ")");
+  failures.Add(path, problem + " (" + ReasonFor(path, error) + ")");
   return false;
 }

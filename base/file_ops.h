@@ -1,6 +1,7 @@
 #pragma once
 
 #include "base/failures.h"
+#include "base/new_file.h"
 
 #include <filesystem>
 #include <string>
@@ -19,14 +20,14 @@ bool WriteAtomically(const std::filesystem::path &target, const std::string &byt
 // Copies `source` over `target` through the temporary file "<target>.partial" and a rename, so
 // that `target` is always either the old file or a complete copy; source and copy end normal.
 // False, with the reason in `failures`, when the copy could not be put in place; attributes that
-// cannot be changed are reported without undoing the copy.
+// cannot be changed are reported without undoing the copy. `progress` hears how far a big copy is.
 bool CopyReplacing(const std::filesystem::path &source, const std::filesystem::path &target,
-                   Failures &failures);
+                   Failures &failures, const CopyProgress &progress = {});
 // CopyReplacing for a copy listed in the journal of the operation, whose recovery deletes what a
 // crash left: a name that is still free is written directly, without the temporary file; a failed
 // copy deletes what it wrote.
 bool CopyJournaled(const std::filesystem::path &source, const std::filesystem::path &target,
-                   Failures &failures);
+                   Failures &failures, const CopyProgress &progress = {});
 // Deletes the file `path`, also a read-only one. False when it cannot be deleted: `failures` then
 // names it with `problem` and the reason, and its attributes are as they were.
 bool RemoveFile(const std::filesystem::path &path, Failures &failures,

@@ -4,6 +4,7 @@
 #include "base/links.h"
 #include "base/names.h"
 #include "base/step_seam.h"
+#include "base/new_file.h"
 
 #include <cerrno>
 #include <system_error>
@@ -51,7 +52,7 @@ bool FileRemover::Remove(const std::string &name, Failures &failures) {
   if (errno == ENOENT)
     return false;
   const std::error_code error(errno, std::generic_category());
-  failures.Add(Child(folder_, name), "cannot be deleted (" + error.message() + ")");
+  failures.Add(Child(folder_, name), "cannot be deleted (" + ReasonFor(name, error) + ")");
   return false;
 }
 #endif

@@ -1,12 +1,14 @@
 #include "base/new_file.h"
 
 #include "base/links.h"
+#include "base/names.h"
 
 #ifdef _WIN32
 #include <algorithm>
 
 #include <windows.h>
 #else
+#include <algorithm>
 #include <cerrno>
 #include <fcntl.h>
 #include <sys/sendfile.h>
@@ -15,6 +17,10 @@
 #endif
 
 namespace fs = std::filesystem;
+
+// How much a copy moves between two reports of its progress: a few tenths of a second on a slow
+// disk, nothing to count on a fast one.
+static constexpr std::uint64_t kChunkBytes = 4 << 20;
 
 #ifdef _WIN32
 static std::error_code LastError() {
@@ -46,17 +52,27 @@ static std::error_code LinkError() {
   return std::make_error_code(std::errc::too_many_symbolic_link_levels);
 }
 
-std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
+static DWORD CALLBACK ReportCopied(LARGE_INTEGER size, LARGE_INTEGER copied, LARGE_INTEGER,
+                                   LARGE_INTEGER, DWORD, DWORD, HANDLE, HANDLE, LPVOID data) {
+  if (copied.QuadPart < size.QuadPart)
+    (*static_cast<const CopyProgress *>(data))(static_cast<std::uint64_t>(copied.QuadPart));
+  return PROGRESS_CONTINUE;
+}
+
+std::error_code CopyToNewFile(const fs::path &source, const fs::path &path,
+                              const CopyProgress &progress) {
   if (IsLink(source))
     return LinkError();
   // Asked first, so that what a failed copy leaves behind is surely its own to delete.
   if (GetFileAttributesW(path.c_str()) != INVALID_FILE_ATTRIBUTES)
     return std::error_code(ERROR_FILE_EXISTS, std::system_category());
   // A source that became a link since is copied as the link, never as what it points at, and the
-  // copy is then deleted again.
+  // copy is then deleted again. Windows reports each chunk it copies to a listener.
   const DWORD flags = COPY_FILE_FAIL_IF_EXISTS | COPY_FILE_COPY_SYMLINK;
+  const LPPROGRESS_ROUTINE report = progress ? ReportCopied : nullptr;
   std::error_code error;
-  if (!CopyFileExW(source.c_str(), path.c_str(), nullptr, nullptr, nullptr, flags))
+  if (!CopyFileExW(source.c_str(), path.c_str(), report, const_cast<CopyProgress *>(&progress),
+                   nullptr, flags))
     error = LastError();
   else if (IsLink(path))
     error = LinkError();
@@ -102,21 +118,31 @@ std::error_code WriteNewFile(const fs::path &path, const std::string &bytes) {
   return error;
 }
 
-// Copies what is left of `in` into `out`; the kernel moves the bytes where it can.
-static bool CopyContent(int in, int out, off_t size) {
-  while (size > 0) {
-    const ssize_t sent = ::sendfile(out, in, nullptr, static_cast<size_t>(size));
+// Copies what is left of `in` (`size` bytes by its size) into `out`, chunk by chunk, telling
+// `progress` after each chunk but the last; the kernel moves the bytes where it can.
+static bool CopyContent(int in, int out, off_t size, const CopyProgress &progress) {
+  std::uint64_t copied = 0;
+  const auto report = [&] {
+    if (progress && copied < static_cast<std::uint64_t>(size))
+      progress(copied);
+  };
+  while (copied < static_cast<std::uint64_t>(size)) {
+    const std::uint64_t left = static_cast<std::uint64_t>(size) - copied;
+    const ssize_t sent =
+        ::sendfile(out, in, nullptr, static_cast<size_t>(std::min(left, kChunkBytes)));
     if (sent < 0 && errno == EINTR)
       continue;
     if (sent < 0 && (errno == EINVAL || errno == ENOSYS))
       break;
     if (sent <= 0)
       return sent == 0;
-    size -= sent;
-    if (size == 0)
-      return true;
+    copied += static_cast<std::uint64_t>(sent);
+    report();
   }
+  if (size > 0 && copied == static_cast<std::uint64_t>(size))
+    return true;
   char buffer[1 << 16];
+  std::uint64_t reported = copied;
   for (;;) {
     const ssize_t got = ::read(in, buffer, sizeof buffer);
     if (got < 0 && errno == EINTR)
@@ -125,10 +151,16 @@ static bool CopyContent(int in, int out, off_t size) {
       return got == 0;
     if (!WriteAll(out, buffer, static_cast<size_t>(got)))
       return false;
+    copied += static_cast<std::uint64_t>(got);
+    if (copied - reported >= kChunkBytes) {
+      reported = copied;
+      report();
+    }
   }
 }
 
-std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
+std::error_code CopyToNewFile(const fs::path &source, const fs::path &path,
+                              const CopyProgress &progress) {
   const int in = ::open(source.c_str(), O_RDONLY | O_NOFOLLOW | O_CLOEXEC);
   if (in < 0)
     return errno == ELOOP ? std::make_error_code(std::errc::too_many_symbolic_link_levels)
@@ -147,7 +179,7 @@ std::error_code CopyToNewFile(const fs::path &source, const fs::path &path) {
     return error;
   }
   std::error_code error;
-  if (!CopyContent(in, out, info.st_size))
+  if (!CopyContent(in, out, info.st_size, progress))
     error = LastError();
   if (::close(out) != 0 && !error)
     error = LastError();
@@ -177,5 +209,39 @@ std::string ReasonOf(const std::error_code &error) {
 #endif
   if (error == std::errc::too_many_symbolic_link_levels)
     return "it is a link, and the program does not follow links";
+#ifdef _WIN32
+  // The program makes every file writable before it changes it: what is still refused is held
+  // open by another program.
+  if (error == std::errc::permission_denied ||
+      (error.category() == std::system_category() &&
+       (error.value() == ERROR_SHARING_VIOLATION || error.value() == ERROR_LOCK_VIOLATION)))
+    return "in use by another program (is the game running?)";
+#endif
   return error.message();
+}
+
+std::string WindowsNameProblem(std::string_view name) {
+  if (!name.empty() && (name.back() == '.' || name.back() == ' '))
+    return "a name Windows cannot keep (it ends in a dot or blank)";
+  // A device name is one whatever extension follows it, and with blanks before the extension.
+  std::string stem(name.substr(0, name.find('.')));
+  while (!stem.empty() && stem.back() == ' ')
+    stem.pop_back();
+  for (char &c : stem)
+    c = static_cast<char>(c >= 'a' && c <= 'z' ? c - 'a' + 'A' : c);
+  const bool numbered = stem.size() == 4 &&
+                        (stem.rfind("COM", 0) == 0 || stem.rfind("LPT", 0) == 0) &&
+                        stem[3] >= '1' && stem[3] <= '9';
+  if (numbered || stem == "CON" || stem == "PRN" || stem == "AUX" || stem == "NUL")
+    return "a name Windows reserves for a device";
+  return "";
+}
+
+std::string ReasonFor([[maybe_unused]] const fs::path &path, const std::error_code &error) {
+#ifdef _WIN32
+  const std::string problem = WindowsNameProblem(NameText(path));
+  if (!problem.empty())
+    return problem;
+#endif
+  return ReasonOf(error);
 }

@@ -1,5 +1,7 @@
 #include "base/text_encoding.h"
 
+#include <algorithm>
+
 #include <array>
 
 namespace {
@@ -114,4 +116,25 @@ std::string NameFromText(std::string_view bytes) {
 #else
   return std::string(bytes);
 #endif
+}
+
+FirstCharacter FirstCharacterOf(std::string_view name) {
+  if (name.empty())
+    return {"", 0};
+  size_t at = 0;
+  char32_t c = 0;
+  if (IsUtf8(name) && NextCodePoint(name, at, c))
+    return {std::string(name.substr(0, at)), at};
+  return {Windows1252ToUtf8(name.substr(0, 1)), 1};
+}
+
+std::string LastCharacterOf(std::string_view text) {
+  // A code point has at most four bytes; the last one that runs to the end is the character.
+  for (size_t length = std::min<size_t>(4, text.size()); length > 1; --length) {
+    size_t at = text.size() - length;
+    char32_t c = 0;
+    if (NextCodePoint(text, at, c) && at == text.size())
+      return std::string(text.substr(text.size() - length));
+  }
+  return std::string(text.substr(text.empty() ? 0 : text.size() - 1));
 }

@@ -19,6 +19,17 @@ std::string ToWindows1252(std::string_view utf8);
 // Text from a file written on Windows: the bytes when they are valid UTF-8, otherwise read as
 // Windows-1252 (what Notepad and older tools write) and given as UTF-8.
 std::string TextAsUtf8(std::string_view bytes);
+// The first character of a name.
+struct FirstCharacter {
+  std::string text; // as UTF-8
+  size_t bytes;     // how many of the name's bytes it takes
+};
+// The first character of `name`: of a valid UTF-8 name its first code point, of any other its
+// first byte read as Windows-1252. Empty for an empty name.
+FirstCharacter FirstCharacterOf(std::string_view name);
+// The last character of UTF-8 `text`: its last code point, or its last byte where that ends no
+// valid sequence. Empty for an empty text.
+std::string LastCharacterOf(std::string_view text);
 // A file name read from a text file, as the platform keeps names: on Windows, where names are
 // UTF-8 here, Windows-1252 text becomes UTF-8; elsewhere the bytes are the name.
 std::string NameFromText(std::string_view bytes);

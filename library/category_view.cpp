@@ -1,13 +1,18 @@
 #include "library/category_view.h"
 
+#include "base/text_encoding.h"
+
 #include <cstddef>
 #include <string_view>
 
-// The letter followed by "-" or a blank, compared case-sensitively.
-static bool InCategory(std::string_view name, std::string_view letter) {
-  const size_t n = letter.size();
-  return n > 0 && name.size() > n && name.compare(0, n, letter) == 0 &&
-         (name[n] == '-' || name[n] == ' ');
+// The letter followed by "-" or a blank, compared case-sensitively, character with character:
+// a name's first character is read the way the category file's letters are.
+static bool InCategory(std::string_view name, const std::string &letter) {
+  if (letter.empty())
+    return false;
+  const FirstCharacter first = FirstCharacterOf(name);
+  return first.text == letter && name.size() > first.bytes &&
+         (name[first.bytes] == '-' || name[first.bytes] == ' ');
 }
 
 static void ShowAll(FolderGrid &grid) {

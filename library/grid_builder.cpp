@@ -3,8 +3,10 @@
 #include "base/names.h"
 #include "library/keeping.h"
 
-#include <array>
+#include "base/text_encoding.h"
+
 #include <iterator>
+#include <unordered_map>
 
 namespace fs = std::filesystem;
 
@@ -19,24 +21,25 @@ void BuildFolderRows(FolderGrid &grid, const std::vector<std::string> &codes,
   grid.ClearFolders();
   grid.library = library;
   // Group the folders by first character once, so each category line costs only its own rows.
-  std::array<std::vector<GridRow>, 256> byLetter;
+  // Letters are characters, compared as the category file's letters are read.
+  std::unordered_map<std::string, std::vector<GridRow>> byLetter;
   for (std::string &name : folderNames) {
     if (name.empty() || IsReservedFolder(name))
       continue;
     GridRow row;
     row.name = std::move(name);
-    byLetter[static_cast<unsigned char>(row.name[0])].push_back(std::move(row));
+    byLetter[FirstCharacterOf(row.name).text].push_back(std::move(row));
   }
   // A letter on two category lines shows its folders twice: only the last line takes the rows.
-  std::array<size_t, 256> lastLine{};
+  std::unordered_map<std::string, size_t> lastLine;
   for (size_t line = 0; line < codes.size(); ++line)
-    if (!codes[line].empty())
-      lastLine[static_cast<unsigned char>(codes[line][0])] = line;
+    lastLine[codes[line]] = line;
   for (size_t line = 0; line < codes.size(); ++line) {
-    if (codes[line].empty())
+    const std::string &letter = codes[line];
+    const auto grouped = byLetter.find(letter);
+    if (letter.empty() || grouped == byLetter.end())
       continue;
-    const auto letter = static_cast<unsigned char>(codes[line][0]);
-    std::vector<GridRow> &rows = byLetter[letter];
+    std::vector<GridRow> &rows = grouped->second;
     if (line == lastLine[letter])
       grid.rows.insert(grid.rows.end(), std::make_move_iterator(rows.begin()),
                        std::make_move_iterator(rows.end()));

@@ -1,6 +1,8 @@
 #include "library/grid_click.h"
 
 #include "base/existence.h"
+#include "base/new_file.h"
+#include "base/text_encoding.h"
 #include "library/keeping.h"
 #include "library/kept_links.h"
 #include "library/loaded_record.h"
@@ -34,10 +36,10 @@ int FirstLoaded(const FolderGrid &grid, char letter) {
   return 0;
 }
 
-// The last loaded row of `letter`, or 0.
-int LastLoaded(const FolderGrid &grid, char letter) {
+// The last loaded row whose first character is `letter`, or 0.
+int LastLoaded(const FolderGrid &grid, const std::string &letter) {
   for (int row = grid.RowCount() - 1; row >= 1; --row)
-    if (IsLoaded(grid.Row(row)) && Letter(grid.Row(row)) == letter)
+    if (IsLoaded(grid.Row(row)) && FirstCharacterOf(grid.Row(row).name).text == letter)
       return row;
   return 0;
 }
@@ -102,7 +104,10 @@ std::vector<std::string> ClickOther(LibraryState &state, int clicked, Caption &c
     SaveLoaded(state, failures);
     return {};
   }
-  const int other = AllowsSeveralLoaded(letter) ? 0 : LastLoaded(state.Unigrid, letter);
+  const int other =
+      AllowsSeveralLoaded(letter)
+          ? 0
+          : LastLoaded(state.Unigrid, FirstCharacterOf(state.Unigrid.Row(clicked).name).text);
   if (other != 0) {
     if (letter == kFlightModel)
       state.Slots.frameVisible = false;
@@ -127,6 +132,12 @@ std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption
   if (state.Ready && !IsLoaded(clicked)) {
     const fs::path folder = state.Unigrid.PathOf(row);
     FolderCheck(folder);
+    // Windows lists a folder whose name it cannot keep, but finds no folder of that name.
+    const std::string odd = WindowsNameProblem(clicked.name);
+    if (!FolderFound && !odd.empty()) {
+      failures.Add(folder, "cannot be loaded: it has " + odd);
+      return {};
+    }
     if (!FolderFound) {
       failures.Add(folder, "is no longer in the library, so nothing was loaded "
                            "(\"Refresh!\" shows the library as it is now)");

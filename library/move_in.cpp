@@ -4,6 +4,7 @@
 #include "base/listing.h"
 #include "base/names.h"
 #include "base/plain_name.h"
+#include "base/progress_meter.h"
 #include "library/file_rules.h"
 #include "library/game_places.h"
 #include "library/keeping.h"
@@ -20,6 +21,7 @@ namespace {
 struct Copy {
   fs::path source;
   Journal::Entry entry;
+  std::uint64_t bytes; // its size, for the progress
 };
 
 // Whether an original of that name is kept already at `path`; nothing when that cannot be told
@@ -85,7 +87,9 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
       }
       keep = true;
     }
-    copies.push_back({source, {target, keep}});
+    std::error_code error;
+    const std::uintmax_t bytes = fs::file_size(source, error);
+    copies.push_back({source, {target, keep}, error ? 0 : bytes});
   }
   return copies;
 }
@@ -125,23 +129,26 @@ std::vector<std::string> MoveIn(LibraryState &state, const fs::path &folder, Cap
     return {};
   }
   LoadedFolder loaded{name, {}};
-  int done = 0;
+  std::uint64_t bytes = 0;
+  for (const Copy &copy : copies)
+    bytes += copy.bytes;
+  ProgressMeter meter(caption, static_cast<int>(copies.size()), bytes);
+  const CopyProgress progress = [&meter](std::uint64_t copied) { meter.Copied(copied); };
   for (const Copy &copy : copies) {
-    caption.Progress(++done, static_cast<int>(copies.size()));
     const PlacedFile &target = copy.entry.file;
+    meter.NextFile("Please wait- copying: :", target.name, copy.bytes);
     const fs::path destination = Child(places.Folder(target.place), target.name);
     // The game's own file goes into safekeeping first; one that cannot is not overwritten.
     if (copy.entry.keepOriginal &&
         !MoveReplacing(destination, OriginalPath(keeping, target), failures))
       continue;
-    if (!CopyJournaled(copy.source, destination, failures)) {
+    if (!CopyJournaled(copy.source, destination, failures, progress)) {
       if (copy.entry.keepOriginal)
         PutOriginalBack(OriginalPath(keeping, target), destination, failures);
       continue;
     }
     loaded.files.push_back(target);
     ++state.tally.copied;
-    caption.Set("Please wait- copying: :" + NameText(copy.source));
   }
   ledger.Append(std::move(loaded));
   ledger.Write(keeping, failures);

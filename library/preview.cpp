@@ -8,7 +8,13 @@
 namespace fs = std::filesystem;
 
 static std::string Description(const fs::path &file) {
-  // A description is a courtesy: one that cannot be read just leaves the preview empty.
+  std::error_code error;
+  const std::uintmax_t size = fs::file_size(file, error);
+  if (!error && size > kMaxTextBytes)
+    return "This description is too large to show: " + std::to_string(size / 1024) +
+           " KB, and a description has at most " + std::to_string(kMaxTextBytes / 1024) +
+           " KB.\r\n";
+  // A description is a courtesy: one that cannot be read otherwise just leaves the preview empty.
   Failures ignored;
   const auto lines = ReadLines(file, ignored, Encoding::Text);
   return lines ? JoinCrLf(*lines) : "";

@@ -4,6 +4,7 @@
 #include "base/listing.h"
 #include "base/name_index.h"
 #include "base/names.h"
+#include "base/progress_meter.h"
 #include "library/game_places.h"
 
 #include <system_error>
@@ -21,9 +22,9 @@ void CarrySaveFiles(const fs::path &eawDir, const fs::path &campaign, Caption &c
   // One listing: each file is tried once, so a file that cannot be moved ends the work.
   const std::vector<std::string> saves = ListFiles(savedata, "*.sve");
   NameIndex campaignFiles(campaign, saves);
-  int done = 0;
+  ProgressMeter meter(caption, static_cast<int>(saves.size()));
   for (const std::string &name : saves) {
-    caption.Progress(++done, static_cast<int>(saves.size()));
+    meter.NextFile("Please wait- copying: :", name);
     const fs::path source = Child(savedata, name);
     const std::string target = campaignFiles.TargetName(name);
     if (!CopyReplacing(source, Child(campaign, target), failures))

@@ -3,6 +3,7 @@
 #include "base/file_ops.h"
 #include "base/listing.h"
 #include "base/names.h"
+#include "base/progress_meter.h"
 #include "library/game_places.h"
 
 #include <system_error>
@@ -43,20 +44,21 @@ std::vector<FileStep> UnplaceFiles(LibraryState &state, const Ledger &ledger,
   const std::unordered_set<std::string> kept = KeptOriginals(keeping);
   GamePlaces places(state.EAWDir);
   std::vector<FileStep> leftovers;
-  int done = 0;
+  ProgressMeter meter(caption, static_cast<int>(entries.size()));
   for (const Journal::Entry &entry : entries) {
-    caption.Progress(++done, static_cast<int>(entries.size()));
     const PlacedFile &file = entry.file;
+    const std::string key = PlaceKey(file.place, file.name);
+    const bool originalKept = kept.count(key) > 0;
+    const auto provider = entry.keepOriginal ? providers.end() : providers.find(key);
+    meter.NextFile(provider != providers.end() || originalKept ? "Please wait- copying: :"
+                                                               : "Deleting ",
+                   file.name);
     if (IsSaveFile(file.name))
       continue;
     const fs::path &folder = places.Folder(file.place);
     if (afterCrash)
       RemovePartial(PartialPath(Child(folder, file.name)));
-    const std::string key = PlaceKey(file.place, file.name);
-    const bool originalKept = kept.count(key) > 0;
-    const auto provider = entry.keepOriginal ? providers.end() : providers.find(key);
     if (provider != providers.end()) {
-      caption.Set("Please wait- copying: :" + file.name);
       if (CopyReplacing(FindAnyCase(Child(state.LibDir, provider->second), file.name),
                         Child(folder, file.name), failures))
         ++state.tally.restored;
@@ -66,7 +68,6 @@ std::vector<FileStep> UnplaceFiles(LibraryState &state, const Ledger &ledger,
       else
         leftovers.push_back({file, true});
     } else if (!entry.keepOriginal) {
-      caption.Set("Deleting " + file.name);
       if (places.Remover(file.place).Remove(file.name, failures))
         ++state.tally.removed;
       else if (StillThere(folder, file.name))

@@ -1,9 +1,19 @@
 #!/usr/bin/env bash
-# Installs the Debian packages the build, the tests (Linux and Windows under Wine) and the demo
-# need; does nothing when all are there.
+# Installs the Debian packages that are missing; does nothing when all are there.
+#   demo: what the program needs to be built and run (scripts/demo.sh)
+#   test: that, and what the tests need: GoogleTest, a display for the screenshots, and the
+#         Windows compiler and Wine for the Windows tests (scripts/test.sh)
 set -euo pipefail
-packages=(cmake g++ make qt6-base-dev libgtest-dev xvfb xauth fonts-liberation2
-  g++-mingw-w64-x86-64-posix wine64)
+demo=(cmake g++ make qt6-base-dev fonts-liberation2)
+test=(libgtest-dev xvfb xauth g++-mingw-w64-x86-64-posix wine64)
+case "${1:-test}" in
+demo) packages=("${demo[@]}") ;;
+test) packages=("${demo[@]}" "${test[@]}") ;;
+*)
+  echo "usage: $0 demo|test" >&2
+  exit 2
+  ;;
+esac
 missing=()
 for p in "${packages[@]}"; do
   dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q "install ok installed" || missing+=("$p")

@@ -3,7 +3,7 @@
 # tab page of the window into docs/, on a virtual display.
 set -euo pipefail
 cd "$(dirname "$0")/.."
-bash scripts/install_deps.sh
+bash scripts/install_deps.sh test
 cmake -S . -B build-demo -DCMAKE_BUILD_TYPE=Release -DSELECTOR_TESTS=OFF
 cmake --build build-demo -j "$(nproc)" --target make_demo_game take_screenshots
 temp="$(mktemp -d)"

@@ -2,6 +2,7 @@
 // picture of each tab page, for the README.
 #include "platform/qt_paths.h"
 #include "ui/main_window.h"
+#include "ui/window_caption.h"
 
 #include <QAction>
 #include <QApplication>
@@ -9,6 +10,8 @@
 #include <QDialog>
 #include <QDir>
 #include <QElapsedTimer>
+#include <QLabel>
+#include <QListWidget>
 #include <QMenu>
 #include <QMouseEvent>
 #include <QPainter>
@@ -53,29 +56,44 @@ bool SavePage(MainWindow &window, QTabWidget &tabs, const Page &page, const QDir
   return Save(window, output, page.file);
 }
 
-// A folder large enough that its load can be caught half way.
+constexpr char kLargeAddon[] = "T-Big Terrain";
+constexpr char kBigFile[] = "terrain.dat";
+
+// A folder with one big file, large enough that its copy can be caught half way, and small ones.
 void MakeLargeAddon(const std::filesystem::path &game) {
-  const std::filesystem::path folder = game / "ZEP128" / "S-Thousands of Small Files";
+  const std::filesystem::path folder = game / "ZEP128" / kLargeAddon;
   std::filesystem::create_directories(folder);
-  const std::string bytes(64 * 1024, 'x');
-  for (int n = 0; n < 3000; ++n)
-    std::ofstream(folder / ("part" + std::to_string(n) + ".dat"), std::ios::binary) << bytes;
+  const std::string chunk(1 << 20, 'x');
+  std::ofstream big(folder / kBigFile, std::ios::binary);
+  for (int n = 0; n < 400; ++n)
+    big << chunk;
+  for (int n = 0; n < 20; ++n)
+    std::ofstream(folder / ("part" + std::to_string(n) + ".dat"), std::ios::binary) << "x";
 }
 
-// Clicks the large folder's row, grabs the window while it loads and once more after.
+// Clicks the large folder's row, grabs the window while the big file is half copied and once
+// more after the load.
 bool SaveLoad(MainWindow &window, QTabWidget &tabs, const QDir &output) {
   tabs.setCurrentIndex(1);
   auto *grid = window.findChild<QTableView *>("Unigrid");
-  const QModelIndexList found =
-      grid->model()->match(grid->model()->index(0, 1), Qt::DisplayRole,
-                           "S-Thousands of Small Files", 1, Qt::MatchExactly);
+  const QModelIndexList found = grid->model()->match(grid->model()->index(0, 1), Qt::DisplayRole,
+                                                     kLargeAddon, 1, Qt::MatchExactly);
   if (found.isEmpty())
     return false;
   grid->scrollTo(found.front());
   Settle();
   bool saved = false;
-  QTimer::singleShot(250, [&] { saved = Save(window, output, "load-in-progress.png"); });
+  auto *progress = window.findChild<QLabel *>("Label22");
+  int bigShown = 0;
+  const QMetaObject::Connection connection = QObject::connect(
+      window.findChild<WindowCaption *>("caption"), &WindowCaption::ProgressShown, [&] {
+        if (!window.windowTitle().contains(kBigFile) || ++bigShown != 2)
+          return;
+        progress->repaint();
+        saved = Save(window, output, "load-in-progress.png");
+      });
   emit grid->clicked(found.front());
+  QObject::disconnect(connection);
   Settle();
   return Save(window, output, "load-summary.png") && saved;
 }
@@ -154,6 +172,16 @@ bool SaveSetupPictures(MainWindow &window, const QDir &output) {
   return dialog != nullptr && Save(*dialog, output, "files-dialog.png");
 }
 
+// Switches the music to the first set listed and grabs the line that says so.
+bool SaveMusicSwitch(MainWindow &window, const QDir &output) {
+  auto *music = window.findChild<QListWidget *>("List4");
+  if (music == nullptr || music->count() == 0)
+    return false;
+  emit music->itemClicked(music->item(0));
+  Settle();
+  return Save(window, output, "music-summary.png");
+}
+
 } // namespace
 
 int main(int argc, char *argv[]) {
@@ -177,5 +205,6 @@ int main(int argc, char *argv[]) {
     saved = SavePage(window, *tabs, page, output) && saved;
   saved = SaveLoad(window, *tabs, output) && saved;
   saved = SaveSetupPictures(window, output) && saved;
+  saved = SaveMusicSwitch(window, output) && saved;
   return saved ? 0 : 1;
 }

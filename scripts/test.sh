@@ -3,7 +3,7 @@
 # then cross-builds the logic tests for Windows and runs them under Wine.
 set -euo pipefail
 cd "$(dirname "$0")/.."
-bash scripts/install_deps.sh
+bash scripts/install_deps.sh test
 build=build-test
 cmake -S . -B "$build" -DCMAKE_BUILD_TYPE=Debug -DSELECTOR_SANITIZE=ON
 cmake --build "$build" -j "$(nproc)"

@@ -36,10 +36,24 @@ std::string RewrittenIni(const std::vector<std::string> &lines, const IniTexts &
   return text;
 }
 
-void inisave(const fs::path &eawDir, bool ready, const IniTexts &texts, Failures &failures) {
+// How many of the keys the file's lines hold.
+static int KeysFound(const std::vector<std::string> &lines) {
+  int found = 0;
+  for (const std::string_view key : kIniKeys)
+    for (const std::string &line : lines)
+      if (StartsWith(line, key)) {
+        ++found;
+        break;
+      }
+  return found;
+}
+
+int inisave(const fs::path &eawDir, bool ready, const IniTexts &texts, Failures &failures) {
   if (!ready)
-    return;
+    return -1;
   const fs::path path = IniPath(eawDir);
-  if (const std::optional<std::vector<std::string>> lines = ReadLinesIfExists(path, failures))
-    WriteAtomically(path, RewrittenIni(*lines, texts), failures);
+  const std::optional<std::vector<std::string>> lines = ReadLinesIfExists(path, failures);
+  if (!lines || !WriteAtomically(path, RewrittenIni(*lines, texts), failures))
+    return -1;
+  return KeysFound(*lines);
 }

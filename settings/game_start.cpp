@@ -13,11 +13,16 @@ bool IsWindowsProgram(const fs::path &program) {
   return in.read(magic, sizeof magic) && magic[0] == 'M' && magic[1] == 'Z';
 }
 
-void StartGame(const fs::path &eawDir, ProgramStarter &starter, Failures &failures) {
+bool StartGame(const fs::path &eawDir, ProgramStarter &starter, Failures &failures) {
   const fs::path program = FindAnyCase(eawDir, "eaw.exe");
   FileCheck(program);
-  if (!FileFound)
+  if (!FileFound) {
     failures.Add(DisplayPath(program) + " was not found.");
-  else if (!starter.StartDetached(program, IsWindowsProgram(program)))
+    return false;
+  }
+  if (!starter.StartDetached(program, IsWindowsProgram(program))) {
     failures.Add(DisplayPath(program) + " could not be run.");
+    return false;
+  }
+  return true;
 }

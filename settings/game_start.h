@@ -8,5 +8,5 @@
 // Whether `program` is a Windows program: its first bytes are "MZ".
 bool IsWindowsProgram(const std::filesystem::path &program);
 // Starts the game's eaw.exe in `eawDir` ("FLY") through `starter`. A missing program, or one
-// that cannot be started, is recorded in `failures` with its path.
-void StartGame(const std::filesystem::path &eawDir, ProgramStarter &starter, Failures &failures);
+// that cannot be started, is recorded in `failures` with its path; true when it was started.
+bool StartGame(const std::filesystem::path &eawDir, ProgramStarter &starter, Failures &failures);

@@ -5,6 +5,8 @@
 #include "base/text_file.h"
 #include "settings/eaw_ini.h"
 
+#include <algorithm>
+#include <map>
 #include <system_error>
 
 namespace fs = std::filesystem;
@@ -46,4 +48,35 @@ bool IniEditorSave(const fs::path &eawDir, const std::string &text, Failures &fa
     return false;
   }
   return WriteAtomically(path, WithCrLf(text) + "\r\n", failures);
+}
+
+// Each key's value in `text`; where a key is on several lines, its last.
+static std::map<std::string, std::string> ValuesByKey(const std::string &text,
+                                                      std::vector<std::string> &order) {
+  std::map<std::string, std::string> values;
+  for (const std::string &line : SplitLines(text)) {
+    const size_t equals = line.find('=');
+    const std::string key = line.substr(0, equals);
+    if (key.empty())
+      continue;
+    if (values.count(key) == 0)
+      order.push_back(key);
+    values[key] = equals == std::string::npos ? "" : line.substr(equals);
+  }
+  return values;
+}
+
+std::vector<std::string> ChangedKeys(const std::string &before, const std::string &after) {
+  std::vector<std::string> order;
+  const auto old = ValuesByKey(before, order);
+  const auto now = ValuesByKey(after, order);
+  std::vector<std::string> changed;
+  for (const std::string &key : order) {
+    const auto was = old.find(key), is = now.find(key);
+    const bool differs = (was == old.end()) != (is == now.end()) ||
+                         (was != old.end() && is != now.end() && was->second != is->second);
+    if (differs && std::find(changed.begin(), changed.end(), key) == changed.end())
+      changed.push_back(key);
+  }
+  return changed;
 }

@@ -5,6 +5,7 @@
 #include "base/links.h"
 #include "base/names.h"
 #include "base/plain_name.h"
+#include "base/new_file.h"
 #include "base/text_file.h"
 #include "settings/music_sets.h"
 
@@ -33,7 +34,8 @@ static bool Rename(const fs::path &from, const fs::path &to, Failures &failures)
   std::error_code error;
   fs::rename(from, to, error);
   if (error)
-    failures.Add(from, "cannot be renamed to " + DisplayPath(to) + " (" + error.message() + ")");
+    failures.Add(from,
+                 "cannot be renamed to " + DisplayPath(to) + " (" + ReasonFor(from, error) + ")");
   return !error;
 }
 

@@ -34,6 +34,7 @@ SlotRow ReadPlaneSet(const fs::path &planeSetFolder, Failures &failures) {
   const std::vector<std::string> descriptions = ListFiles(planeSetFolder, "*.zep");
   if (descriptions.empty())
     return row;
+  row.file = descriptions.front();
   const auto lines = ReadLines(Child(planeSetFolder, descriptions.front()), failures);
   if (!lines)
     return row;

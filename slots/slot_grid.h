@@ -5,6 +5,12 @@
 
 #include <cstdint>
 #include <filesystem>
+#include <string>
+#include <vector>
+
+// The slot panel's title: the flight-model folder's name and the names of the plane-set files
+// its rows were read from ("F-Pack: planes.zep").
+std::string SlotTitle(const std::string &folder, const std::vector<SlotRow> &rows);
 
 // Fills the slot grid `slots` from the plane-set folders of the flight-model folder `FMfolder`,
 // in name order, and shows the grid. First takes `GridBackColor` from the slot grid's current

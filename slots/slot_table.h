@@ -13,6 +13,7 @@ struct SlotRow {
   std::string plnSlot;
   std::string skinSlot;
   std::string aircraft;
+  std::string file; // the plane-set file the row was read from; empty for none
 };
 
 // The slot-grid panel `SlotFrame` with `SlotLabel` and `SlotGrid`.

@@ -18,6 +18,8 @@ namespace fs = std::filesystem;
 
 namespace {
 
+const std::string kInUse = "in use by another program (is the game running?)";
+
 DWORD Attributes(const fs::path &path) { return GetFileAttributesW(path.c_str()); }
 bool Has(const fs::path &path, DWORD attribute) { return (Attributes(path) & attribute) != 0; }
 void Give(const fs::path &path, DWORD attributes) { SetFileAttributesW(path.c_str(), attributes); }
@@ -151,6 +153,7 @@ TEST_F(WindowsFiles, AFileHeldOpenIsSkippedNamedAndLeftAsItWas) {
     EXPECT_FALSE(game.Exists("held.dat.partial"));
     ASSERT_EQ(failures.Lines().size(), 1u);
     EXPECT_NE(failures.Lines()[0].find("held.dat"), std::string::npos);
+    EXPECT_NE(failures.Lines()[0].find(kInUse), std::string::npos) << failures.Lines()[0];
   }
   EXPECT_EQ(game.Read("held.dat"), "the game's");
 
@@ -170,6 +173,8 @@ TEST_F(WindowsFiles, AFileHeldOpenIsSkippedNamedAndLeftAsItWas) {
   EXPECT_EQ(game.Record(), "kept\r\n");
   EXPECT_FALSE(game.Exists("ZEP128/FoldersLoaded.txt.partial"));
   EXPECT_EQ(later.Lines().size(), 2u) << later.Message("");
+  for (const std::string &line : later.Lines())
+    EXPECT_NE(line.find(kInUse), std::string::npos) << line;
 }
 
 TEST(WindowsNames, MusicSetsWithTrailingBlanksAndDotsFindTheirFolders) {

@@ -29,7 +29,9 @@ fs::path GameFolder::Addon(const std::string &name,
 }
 
 bool RecordingCaption::Showed(const std::string &line) const {
-  return std::find(shown.begin(), shown.end(), line) != shown.end();
+  return std::find_if(shown.begin(), shown.end(), [&](const std::string &text) {
+           return text == line || text.rfind(line + " (", 0) == 0;
+         }) != shown.end();
 }
 
 std::vector<std::string> RowNames(const FolderGrid &grid, bool marks) {

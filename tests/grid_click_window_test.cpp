@@ -111,6 +111,8 @@ TEST(GridClickWindow, FlightModelShowsItsPlaneSetsUntilUnloaded) {
   EXPECT_EQ(slotGrid->horizontalHeaderItem(3)->text(), "Aircraft");
   EXPECT_EQ(slotGrid->item(0, 2)->text(), "P38H");
   EXPECT_EQ(slotGrid->item(0, 3)->text(), "Lightning");
+  EXPECT_EQ(slotGrid->item(0, 3)->toolTip(), "Lightning");
+  EXPECT_EQ(driver.Find<QLabel>("SlotLabel")->text(), "F-Fast: plane.zep");
   // The panel covers the description box: it gives way while the pointer is over a row.
   QTableView *grid = driver.Grid();
   QTest::mouseMove(grid->viewport(), grid->visualRect(grid->model()->index(1, 1)).center());
@@ -118,6 +120,7 @@ TEST(GridClickWindow, FlightModelShowsItsPlaneSetsUntilUnloaded) {
   QTest::mouseMove(driver.Find<QWidget>("LoadFrame"), QPoint(150, 4));
   EXPECT_TRUE(panel->isVisible());
   driver.ClickRow(2);
+  EXPECT_EQ(Mark(driver, 2), "S");
   EXPECT_FALSE(panel->isVisible());
 }
 

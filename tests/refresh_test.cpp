@@ -40,8 +40,11 @@ TEST(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   EXPECT_EQ(RowNames(state.Unigrid, true),
             (Names{"F-Hurri", "S-Camo [S]", "S-Desert", "G-Sky [S]"}));
   EXPECT_EQ(state.Unigrid.rows[2].nameColour, kLoadedColour);
-  for (const GridRow &row : state.Unigrid.rows)
-    EXPECT_EQ(row.height, kRowHeight);
+  // The category shown before is shown again, with its header.
+  for (int row = 1; row < state.Unigrid.RowCount(); ++row)
+    EXPECT_EQ(state.Unigrid.Row(row).height, row == 2 || row == 3 ? kRowHeight : 0) << row;
+  EXPECT_EQ(state.Unigrid.Row(0).name, "Only one selection can be made!");
+  EXPECT_EQ(state.summary, "Refresh: 4 folders, 2 new, 1 gone");
   EXPECT_EQ(state.Codes, (Names{"S"}));
   EXPECT_EQ(state.HoverRow, -1);
   EXPECT_TRUE(state.Ready);

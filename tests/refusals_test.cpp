@@ -1,5 +1,7 @@
 #include "app/selector.h"
 #include "base/new_file.h"
+#include "library/grid_click.h"
+#include "tests/game_folder.h"
 #include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
@@ -45,8 +47,34 @@ TEST_F(Refusals, NamesOfTheLongestLengthAreLoaded) {
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
-TEST(Reasons, AFullDiskIsCalledSo) {
+TEST(Reasons, AFullDiskAHeldFileAndNamesWindowsCannotKeepAreCalledSo) {
   EXPECT_EQ(ReasonOf(std::make_error_code(std::errc::no_space_on_device)), "the disk is full");
+#ifdef _WIN32
+  EXPECT_EQ(ReasonOf(std::make_error_code(std::errc::permission_denied)),
+            "in use by another program (is the game running?)");
+#else
   EXPECT_EQ(ReasonOf(std::make_error_code(std::errc::permission_denied)),
             std::make_error_code(std::errc::permission_denied).message());
+#endif
+  const std::string device = "a name Windows reserves for a device";
+  const std::string dotted = "a name Windows cannot keep (it ends in a dot or blank)";
+  const std::pair<const char *, std::string> names[] = {
+      {"CON", device},      {"nul.txt", device},  {"Com1.dat", device}, {"lpt9 .x", device},
+      {"aux", device},      {"CONSOLE", ""},      {"COM10", ""},        {"COM0", ""},
+      {"mission.", dotted}, {"mission ", dotted}, {"plain.dat", ""},    {".hidden", ""}};
+  for (const auto &[name, problem] : names)
+    EXPECT_EQ(WindowsNameProblem(name), problem) << name;
+
+  // A folder Windows lists but cannot find by such a name says why it is not loaded.
+  GameFolder game;
+  game.WithCategories("Skins: S\r\n");
+  LibraryState state = LibraryFor(game.Path());
+  state.Ready = true;
+  state.Unigrid.library = state.LibDir;
+  state.Unigrid.rows.push_back(GridRow{"S-odd.", "", 0, kRowHeight});
+  RecordingCaption caption;
+  Failures failures;
+  ClickRow(state, 1, caption, failures);
+  ASSERT_EQ(failures.Lines().size(), 1u);
+  EXPECT_NE(failures.Lines()[0].find("cannot be loaded: it has " + dotted), std::string::npos);
 }

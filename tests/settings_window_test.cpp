@@ -43,6 +43,7 @@ TEST(SettingsWindow, BoxesShowTheLastKeyAndEnterRewritesEveryKeyLine) {
   EXPECT_TRUE(IsWritable(ini));
   EXPECT_FALSE(game.Exists("eaw.ink"));
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
+  EXPECT_EQ(driver.Find<QLabel>("Label22")->text(), "3 settings saved to eaw.ini");
 
   // A temporary name taken by a folder makes the write fail: the file stays as it was.
   game.Write("eaw.ini.partial/in-the-way");
@@ -75,6 +76,7 @@ TEST(SettingsWindow, EditorShowsSavesAndHides) {
   text->setPlainText("Width=1280\n");
   QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
   EXPECT_EQ(driver.Find<QLineEdit>("Text5")->text(), "1280");
+  EXPECT_EQ(driver.Find<QLabel>("Label22")->text(), "eaw.ini saved");
   QTest::mouseClick(editor, Qt::LeftButton, {}, QPoint(editor->width() - 5, editor->height() - 5));
   EXPECT_FALSE(editor->isVisible());
 }
@@ -101,6 +103,7 @@ TEST(SettingsWindow, MusicListSwitchesThereAndBack) {
   const QStringList messages = driver.TakeMessages();
   ASSERT_EQ(messages.size(), 1);
   EXPECT_TRUE(messages[0].contains("line 2 was ignored")) << messages[0].toStdString();
+  EXPECT_EQ(driver.Find<QLabel>("Label22")->text(), "Music set Swing is playing");
   ASSERT_EQ(list->count(), 2);
   EXPECT_EQ(list->item(1)->text(), "Rock");
 
@@ -143,6 +146,7 @@ TEST(SettingsWindow, FlyStartsTheGameEachTimeOrSaysWhyNot) {
   QTest::mouseClick(fly, Qt::LeftButton);
   QTest::mouseClick(fly, Qt::LeftButton);
   EXPECT_TRUE(QTest::qWaitFor([&] { return StartedCount(game.Path()) == 2; }, 5000));
+  EXPECT_EQ(driver.Find<QLabel>("Label22")->text(), "Game started");
   EXPECT_TRUE(driver.Window().isVisible());
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 }

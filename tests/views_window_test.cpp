@@ -143,11 +143,14 @@ TEST(ViewsWindow, TheSelectedCategoryShowsAgainTypingFindsAShownRowAndLoadedRows
   for (const char *name : {"S-alpha", "S-beta", "N-bravo"})
     game.MakeFolder(std::string("ZEP128/") + name);
   WindowDriver driver(game.Path());
+  ChooseCategory(driver, 3);
   ChooseCategory(driver, 2);
   QTest::mouseClick(driver.Find<QLabel>("Label33"), Qt::LeftButton);
-  EXPECT_EQ(ShownFolders(driver).size(), 3);
-  ChooseCategory(driver, 2);
+  // A refresh keeps the category shown, its header and its letter.
   EXPECT_EQ(ShownFolders(driver), (QStringList{"S-alpha", "S-beta"}));
+  EXPECT_EQ(Header(driver), "Only one selection can be made!");
+  EXPECT_EQ(driver.Find<QLabel>("Label6")->text(), "S");
+  EXPECT_EQ(driver.Find<QLabel>("Label22")->text(), "Refresh: 3 folders, 0 new, 0 gone");
 
   QTableView *grid = driver.Grid();
   grid->setFocus();

@@ -90,3 +90,10 @@ bool ConfirmDeletion(QWidget *parent, int loadedFiles, const std::vector<std::st
   delete box;
   return agreed;
 }
+
+bool Confirm(QWidget *parent, const QString &question) {
+  QMessageBox box(QMessageBox::Question, WindowCaptionText().simplified(), question,
+                  QMessageBox::Ok | QMessageBox::Cancel, parent);
+  box.setDefaultButton(QMessageBox::Cancel);
+  return box.exec() == QMessageBox::Ok;
+}

@@ -17,3 +17,5 @@ void ShowNotice(QWidget *parent, const std::string &notice);
 // files `names` it deletes, their first names and the whole list under "Show Details". Cancel is
 // the default button. True when the user chose OK.
 bool ConfirmDeletion(QWidget *parent, int loadedFiles, const std::vector<std::string> &names);
+// Asks `question` in a box over `parent` with OK and Cancel, Cancel the default. True for OK.
+bool Confirm(QWidget *parent, const QString &question);

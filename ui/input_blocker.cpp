@@ -15,17 +15,9 @@ InputBlocker::~InputBlocker() {
   QApplication::restoreOverrideCursor();
 }
 
+// Every input event goes: a pointer move made meanwhile would show the preview of a row that
+// has changed under it, and a release would finish a click whose press was dropped.
 bool InputBlocker::eventFilter(QObject *, QEvent *event) {
-  switch (event->type()) {
-  case QEvent::MouseButtonPress:
-  case QEvent::MouseButtonRelease:
-  case QEvent::MouseButtonDblClick:
-  case QEvent::KeyPress:
-  case QEvent::KeyRelease:
-  case QEvent::Wheel:
-  case QEvent::Shortcut:
-    return true;
-  default:
-    return false;
-  }
+  return event->isInputEvent() || event->type() == QEvent::Shortcut ||
+         event->type() == QEvent::ShortcutOverride;
 }

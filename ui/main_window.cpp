@@ -4,6 +4,7 @@
 #include "platform/qt_paths.h"
 #include "ui/event_hook.h"
 #include "ui/failure_box.h"
+#include "ui/fitted_text.h"
 #include "ui/folder_grid_model.h"
 #include "ui/input_blocker.h"
 #include "ui/picture.h"
@@ -20,6 +21,7 @@
 #include <QScreen>
 #include <QStyle>
 #include <QTimer>
+#include <utility>
 
 namespace fs = std::filesystem;
 
@@ -32,11 +34,12 @@ MainWindow::MainWindow(const fs::path &eawDir)
   c_.Unigrid->setModel(gridModel_);
   WireEvents();
   WireHooks();
-  summaryShown_.setSingleShot(true);
-  connect(&summaryShown_, &QTimer::timeout, this, [this] { c_.Label22->setText(kInstructions); });
   connect(new SetupMenu(selector_, c_.Unigrid, this), &SetupMenu::Changed, this, [this] {
     ShowSummary();
     ShowGridChanges();
+  });
+  starter_.OnQuickFailure([this](const QString &program, const QString &status) {
+    ShowNotice(this, ToName(program + " ended at once (" + status + "): the game did not start."));
   });
 }
 
@@ -87,16 +90,16 @@ void MainWindow::WireHooks() {
     return false;
   });
   OnEvents(c_.Unigrid, [this](QEvent *event) {
-    if (event->type() != QEvent::KeyPress)
+    if (event->type() != QEvent::KeyPress && event->type() != QEvent::KeyRelease)
       return false;
     auto *key = static_cast<QKeyEvent *>(event);
     if (key->key() == Qt::Key_Return || key->key() == Qt::Key_Enter) {
       // Only a fresh press acts: a held key would load and unload the row by turns.
-      if (!key->isAutoRepeat())
+      if (enterHeld_.FreshPress(*key))
         Unigrid_KeyPress(kEnterKey);
       return true;
     }
-    if (key->text().isEmpty() || !key->text()[0].isPrint())
+    if (event->type() != QEvent::KeyPress || key->text().isEmpty() || !key->text()[0].isPrint())
       return false;
     Unigrid_Type(key->text());
     return true;
@@ -106,8 +109,12 @@ void MainWindow::WireHooks() {
       c_.Frame21->hide();
     return false;
   });
+  // A click is a press and a release on the label: a release alone, after a press dropped while
+  // an operation ran, does nothing.
   OnEvents(c_.Label33, [this](QEvent *event) {
-    if (event->type() == QEvent::MouseButtonRelease)
+    if (event->type() == QEvent::MouseButtonPress)
+      label33Pressed_ = true;
+    if (event->type() == QEvent::MouseButtonRelease && std::exchange(label33Pressed_, false))
       Label33_Click();
     return false;
   });
@@ -133,6 +140,8 @@ void MainWindow::FormLoad() {
   c_.SSTab1->setEnabled(true);
   ShowGridChanges();
   FillMusicList();
+  // Finishing an interrupted operation showed its progress in the instructions' place.
+  ShowSummary();
   QTimer::singleShot(
       0, this, [this, failures] { ShowFailures(this, failures, "Start-up could not do all:"); });
 }
@@ -153,9 +162,12 @@ void MainWindow::Command3_Click() { close(); }
 
 void MainWindow::Command8_Click() { showMinimized(); }
 
+// The description goes with the picture, so that the two never tell of different folders.
 void MainWindow::ClearPreview() {
+  selector_.LeaveGrid();
   c_.SlotFrame->setVisible(State().Slots.frameVisible);
   c_.MyLabel->clear();
+  c_.Text9->clear();
   ShowPicture(c_.MyImage, State().BackPic);
 }
 
@@ -173,6 +185,7 @@ void MainWindow::Label33_Click() {
   }
   ShowGridRows();
   ShowGridChanges();
+  ShowSummary();
   ShowFailures(this, failures, "Refresh could not do all:");
 }
 
@@ -266,22 +279,47 @@ void MainWindow::inisave() {
     texts[key] = ToName(c_.SettingsBoxes[key]->text());
   Failures failures;
   selector_.SaveSettings(texts, failures);
+  ShowSummary();
+  // The editor shows the file as it is now, unless the player has changed its text.
+  if (!State().summary.empty() && c_.Frame21->isVisible() && !EditorEdited())
+    ShowEditorText(failures);
   ShowFailures(this, failures, "The settings could not be saved:");
 }
 
 void MainWindow::IniEdit_Click() {
   c_.Frame21->show();
   Failures failures;
-  editorShown_ = FromText(selector_.SettingsFileText(failures), &editorWindows1252_);
-  c_.Text14->setPlainText(editorShown_);
-  editorShownPlain_ = c_.Text14->toPlainText();
+  ShowEditorText(failures);
   ShowFailures(this, failures, "The settings file could not be shown:");
 }
 
+void MainWindow::ShowEditorText(Failures &failures) {
+  editorFile_ = selector_.SettingsFileText(failures);
+  editorShown_ = FromText(editorFile_, &editorWindows1252_);
+  c_.Text14->setPlainText(editorShown_);
+  editorShownPlain_ = c_.Text14->toPlainText();
+}
+
+bool MainWindow::EditorEdited() const { return c_.Text14->toPlainText() != editorShownPlain_; }
+
 void MainWindow::InSaver_Click() {
   Failures failures;
-  if (selector_.SaveSettingsFile(ToText(EditorText(), editorWindows1252_), failures))
+  const std::string file = selector_.SettingsFileText(failures);
+  if (file != editorFile_ && !EditorEdited()) {
+    ShowEditorText(failures);
+  } else if (file != editorFile_) {
+    QString keys;
+    for (const std::string &key : selector_.ChangedSettings(editorFile_, file))
+      keys += (keys.isEmpty() ? "" : ", ") + FromName(key);
+    if (!Confirm(this, "eaw.ini has changed since the editor showed it (" + keys +
+                           "). Save the editor's text over it?"))
+      return;
+  }
+  if (selector_.SaveSettingsFile(ToText(EditorText(), editorWindows1252_), failures)) {
+    editorFile_ = selector_.SettingsFileText(failures);
     IniRead();
+  }
+  ShowSummary();
   ShowFailures(this, failures, "The settings file could not be saved:");
 }
 
@@ -321,24 +359,23 @@ void MainWindow::List4_Click(QListWidgetItem *item) {
   }
   // What Music.ini holds was said at the start, not again at each switch.
   FillMusicList(false);
+  ShowSummary();
   ShowFailures(this, failures, "The music could not be switched:");
 }
 
 void MainWindow::delmsn_Click() {
   Failures failures;
   selector_.StartGame(failures);
+  ShowSummary();
   ShowFailures(this, failures, "The game could not be started:");
 }
 
-// The line that sums up a load, unload or Reset All takes the place of the instructions above
-// the category list for a few seconds, or until the next one.
+// The line that sums up the last action takes the place of the instructions above the category
+// list until the next action; cut to the label's lines, whole in its tooltip.
 void MainWindow::ShowSummary() {
-  if (State().summary.empty()) {
-    c_.Label22->setText(kInstructions);
-    return;
-  }
-  c_.Label22->setText(FromName(State().summary));
-  summaryShown_.start(kSummarySeconds * 1000);
+  const QString summary = FromName(State().summary);
+  c_.Label22->setText(summary.isEmpty() ? QString(kInstructions) : FittedText(c_.Label22, summary));
+  c_.Label22->setToolTip(summary);
 }
 
 void MainWindow::ShowGridRows() {

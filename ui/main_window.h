@@ -2,18 +2,15 @@
 
 #include "app/selector.h"
 #include "platform/qt_program_starter.h"
+#include "ui/held_key.h"
 #include "ui/window_caption.h"
 #include "ui/window_layout.h"
 
 #include <QElapsedTimer>
-#include <QTimer>
 #include <QWidget>
 #include <filesystem>
 
 class FolderGridModel;
-
-// How long the line that sums up an operation stays in view.
-inline constexpr int kSummarySeconds = 6;
 
 // The program's one window: builds its controls, forwards their events to the Selector's verbs
 // and draws the Selector's state.
@@ -43,6 +40,8 @@ private:
   void inisave();
   void IniEdit_Click();
   void InSaver_Click();
+  void ShowEditorText(Failures &failures);
+  bool EditorEdited() const;
   // Fills the music list; with `tell`, says which lines of Music.ini name no set.
   void FillMusicList(bool tell = true);
   void List4_Click(QListWidgetItem *item);
@@ -65,8 +64,10 @@ private:
   bool editorWindows1252_ = false; // the eaw.ini editor's text came from Windows-1252 bytes
   QString editorShown_;            // the text the editor was given
   QString editorShownPlain_;       // the same as the editor gives it back
+  std::string editorFile_;         // eaw.ini's bytes when the editor was given its text
   std::string currentMusic_;       // the music set Label11 shows, byte for byte
-  QTimer summaryShown_;            // how long the summary line stays
   QString typed_;                  // letters typed into the grid in quick succession
   QElapsedTimer typedSince_;
+  HeldKey enterHeld_;           // Enter on the grid acts once however long it is held
+  bool label33Pressed_ = false; // "Refresh!" acts on the release of a press it saw
 };

@@ -12,8 +12,11 @@ const std::array<const char *, kSlotColumns> kHeaders = {"Folder", "PlnSlot", "S
 // Width of each column; 0 hides it.
 const std::array<int, kSlotColumns> kWidthsTwips = {2000, 0, 0, 2000, 0};
 
+// A name too long for its column is read whole in the tooltip, as in the folder grid.
 void SetCell(QTableWidget *grid, int row, int column, const QString &text) {
-  grid->setItem(row, column, new QTableWidgetItem(text));
+  auto *item = new QTableWidgetItem(text);
+  item->setToolTip(text);
+  grid->setItem(row, column, item);
 }
 
 } // namespace

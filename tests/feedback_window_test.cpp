@@ -1,0 +1,214 @@
+#include "tests/game_folder.h"
+#include "tests/window_driver.h"
+#include "ui/window_caption.h"
+
+#include <QApplication>
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QPlainTextEdit>
+#include <QTest>
+#include <gtest/gtest.h>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+// Runs `post` the first time the window shows how far an operation is: what it posts waits in
+// the queue while the operation runs, as a person's input does.
+void WhileBusy(WindowDriver &driver, std::function<void()> post) {
+  auto *caption = driver.Window().findChild<WindowCaption *>("caption");
+  auto connection = std::make_shared<QMetaObject::Connection>();
+  *connection = QObject::connect(caption, &WindowCaption::ProgressShown, [=] {
+    QObject::disconnect(*connection);
+    post();
+  });
+}
+
+QString Mark(WindowDriver &driver, int row) {
+  return driver.Grid()->model()->index(row - 1, 2).data().toString();
+}
+
+QString Summary(WindowDriver &driver) { return driver.Find<QLabel>("Label22")->text(); }
+
+QKeyEvent *Enter(QEvent::Type type, bool repeat) {
+  return new QKeyEvent(type, Qt::Key_Return, Qt::NoModifier, "\r", repeat);
+}
+
+// What a platform sends for each repeat of a held key.
+enum class Held { XMarked, XPairs, Windows };
+
+std::vector<QKeyEvent *> OneRepeat(Held held) {
+  switch (held) {
+  case Held::XMarked:
+    return {Enter(QEvent::KeyRelease, true), Enter(QEvent::KeyPress, true)};
+  case Held::XPairs:
+    return {Enter(QEvent::KeyRelease, false), Enter(QEvent::KeyPress, false)};
+  case Held::Windows:
+    return {Enter(QEvent::KeyPress, true)};
+  }
+  return {};
+}
+
+void Send(QObject *target, QEvent *event) {
+  QApplication::sendEvent(target, event);
+  delete event;
+}
+
+class HeldEnter : public testing::TestWithParam<Held> {};
+
+} // namespace
+
+TEST_P(HeldEnter, ActsOnceWhateverThePlatformSendsWhileItIsHeld) {
+  GameFolder game;
+  game.WithGameFolders().WithCategories("Singles: Q\r\n");
+  game.Addon("Q-One", {"a.dat"});
+  WindowDriver driver(game.Path());
+  QTableView *grid = driver.Grid();
+  grid->setCurrentIndex(grid->model()->index(0, 1));
+  WhileBusy(driver, [&] {
+    for (int repeat = 0; repeat < 3; ++repeat)
+      for (QKeyEvent *event : OneRepeat(GetParam()))
+        QCoreApplication::postEvent(grid, event);
+  });
+  Send(grid, Enter(QEvent::KeyPress, false));
+  for (int repeat = 0; repeat < 3; ++repeat)
+    for (QKeyEvent *event : OneRepeat(GetParam()))
+      Send(grid, event);
+  Send(grid, Enter(QEvent::KeyRelease, false));
+  QApplication::processEvents();
+  EXPECT_EQ(Mark(driver, 1), "S");
+  EXPECT_TRUE(game.Exists("a.dat"));
+
+  // The next press is a fresh one.
+  QTest::qWait(50);
+  Send(grid, Enter(QEvent::KeyPress, false));
+  EXPECT_EQ(Mark(driver, 1), "");
+}
+
+INSTANTIATE_TEST_SUITE_P(Platforms, HeldEnter,
+                         testing::Values(Held::XMarked, Held::XPairs, Held::Windows));
+
+TEST(FeedbackWindow, InputQueuedWhileALoadRunsIsDropped) {
+  GameFolder game;
+  game.WithGameFolders().WithCategories("Singles: Q\r\n");
+  game.Addon("Q-One", {"a.dat"});
+  game.Write("ZEP128/Q-Two/contents.txt", "second folder");
+  WindowDriver driver(game.Path());
+  auto *refresh = driver.Find<QLabel>("Label33");
+  QWidget *rows = driver.Grid()->viewport();
+  const QPoint second = driver.Grid()->visualRect(driver.Grid()->model()->index(1, 1)).center();
+  WhileBusy(driver, [&] {
+    game.MakeFolder("ZEP128/Q-Three");
+    QCoreApplication::postEvent(refresh, new QMouseEvent(QEvent::MouseButtonPress, QPointF(2, 2),
+                                                         refresh->mapToGlobal(QPointF(2, 2)),
+                                                         Qt::LeftButton, Qt::LeftButton, {}));
+    QCoreApplication::postEvent(rows, new QMouseEvent(QEvent::MouseMove, second,
+                                                      rows->mapToGlobal(QPointF(second)),
+                                                      Qt::NoButton, Qt::NoButton, {}));
+  });
+  driver.ClickRow(1);
+  // The button is let go after the load: a release alone is no click on "Refresh!".
+  QTest::mouseRelease(refresh, Qt::LeftButton, {}, QPoint(2, 2));
+  QApplication::processEvents();
+  EXPECT_EQ(Mark(driver, 1), "S");
+  EXPECT_EQ(driver.Grid()->model()->rowCount(), 2);
+  EXPECT_FALSE(driver.Find<QPlainTextEdit>("Text9")->toPlainText().contains("second"));
+}
+
+TEST(FeedbackWindow, ABigFileShowsItsBytesInTheLineAndTheFileCountInTheCaption) {
+  GameFolder game;
+  game.WithGameFolders().WithCategories("Singles: Q\r\n");
+  game.Write("ZEP128/Q-Big/big.dat", std::string(9 << 20, 'x'));
+  WindowDriver driver(game.Path());
+  const QString caption = driver.Window().windowTitle();
+  QStringList lines, captions;
+  QObject::connect(driver.Window().findChild<WindowCaption *>("caption"),
+                   &WindowCaption::ProgressShown, [&] {
+                     lines << Summary(driver);
+                     captions << driver.Window().windowTitle();
+                   });
+  driver.ClickRow(1);
+  ASSERT_FALSE(lines.isEmpty());
+  EXPECT_EQ(lines[0], "Please wait: 1 of 1 files, 0.0 of 9.0 MB");
+  EXPECT_EQ(captions[0], "Please wait- copying: :big.dat (1 of 1)");
+  EXPECT_EQ(driver.Window().windowTitle(), caption);
+  EXPECT_EQ(Summary(driver), "Loaded \"Q-Big\": 1 file copied.");
+}
+
+TEST(FeedbackWindow, AStartThatFinishedAnInterruptedUnloadShowsTheInstructions) {
+  GameFolder game;
+  game.WithCategories("Sounds: N\r\n");
+  game.Addon("N-A", {"a.dat", "b.dat"});
+  game.Write("a.dat");
+  game.Write("b.dat");
+  game.Write("ZEP128/#Selector/journal.txt", "unload\r\nN-A\r\n\tG-a.dat\r\n\tG-b.dat\r\n");
+  WindowDriver driver(game.Path());
+  EXPECT_FALSE(game.Exists("a.dat"));
+  EXPECT_EQ(Summary(driver), kInstructions);
+}
+
+TEST(FeedbackWindow, AGameThatEndsAtOnceWithAnErrorIsToldOnce) {
+  GameFolder game;
+  const fs::path exe = game.Write("eaw.exe", "#!/bin/sh\nexit 3\n");
+  fs::permissions(exe, fs::perms::owner_exec, fs::perm_options::add);
+  WindowDriver driver(game.Path());
+  QTest::mouseClick(driver.Find<QPushButton>("delmsn"), Qt::LeftButton);
+  EXPECT_EQ(Summary(driver), "Game started");
+  QStringList messages;
+  EXPECT_TRUE(QTest::qWaitFor([&] { return !(messages = driver.TakeMessages()).isEmpty(); }));
+  ASSERT_EQ(messages.size(), 1);
+  EXPECT_TRUE(messages[0].contains("status 3")) << messages[0].toStdString();
+  QTest::qWait(300);
+  EXPECT_TRUE(driver.TakeMessages().isEmpty());
+}
+
+TEST(FeedbackWindow, ThePreviewComesBackForTheSameRowAndClearsWhole) {
+  GameFolder game;
+  game.WithCategories("Skins: S\r\n");
+  game.Write("ZEP128/S-a/contents.txt", "first");
+  game.Write("ZEP128/S-b/contents.txt", std::string((1 << 20) + 1, 'x'));
+  WindowDriver driver(game.Path());
+  QTableView *grid = driver.Grid();
+  auto *text = driver.Find<QPlainTextEdit>("Text9");
+  const auto hover = [&](int row) {
+    QTest::mouseMove(grid->viewport(), grid->visualRect(grid->model()->index(row - 1, 1)).center());
+  };
+  hover(1);
+  EXPECT_EQ(text->toPlainText(), "first\n");
+  QTest::mouseMove(driver.Find<QWidget>("LoadFrame"), QPoint(200, 3));
+  EXPECT_EQ(text->toPlainText(), "");
+  hover(1);
+  EXPECT_EQ(text->toPlainText(), "first\n");
+  hover(2);
+  EXPECT_TRUE(text->toPlainText().startsWith("This description is too large to show: 1024 KB"));
+  // The pointer stays where a test leaves it, and a move to the same place is no move.
+  QTest::mouseMove(driver.Find<QWidget>("LoadFrame"), QPoint(200, 3));
+}
+
+TEST(FeedbackWindow, TheEditorFollowsTheBoxesAndAsksBeforeSavingOverAChange) {
+  GameFolder game;
+  game.Write("eaw.ini", "Width=800\r\nHeight=600\r\n");
+  WindowDriver driver(game.Path());
+  driver.Find<QTabWidget>("SSTab1")->setCurrentIndex(0);
+  QTest::mouseClick(driver.Find<QPushButton>("IniEdit"), Qt::LeftButton);
+  auto *text = driver.Find<QPlainTextEdit>("Text14");
+  const auto enter = [&](const char *box, const char *value) {
+    auto *edit = driver.Find<QLineEdit>(box);
+    edit->setText(value);
+    QTest::keyClick(edit, Qt::Key_Return);
+  };
+  enter("Text5", "1024");
+  EXPECT_EQ(text->toPlainText(), "Width=1024\nHeight=600\n");
+
+  text->setPlainText("Width=1024\nHeight=600\nExtra=1\n");
+  enter("Text6", "768");
+  EXPECT_EQ(text->toPlainText(), "Width=1024\nHeight=600\nExtra=1\n");
+  auto *save = driver.Find<QPushButton>("InSaver");
+  EXPECT_EQ(
+      driver.AnswerNextBox(QMessageBox::Cancel, [&] { QTest::mouseClick(save, Qt::LeftButton); }),
+      "eaw.ini has changed since the editor showed it (Height). Save the editor's text over "
+      "it?");
+  EXPECT_EQ(game.Read("eaw.ini"), "Width=1024\r\nHeight=768\r\n");
+  driver.AnswerNextBox(QMessageBox::Ok, [&] { QTest::mouseClick(save, Qt::LeftButton); });
+  EXPECT_EQ(game.Read("eaw.ini"), "Width=1024\r\nHeight=600\r\nExtra=1\r\n\r\n");
+}
