@@ -99,8 +99,10 @@ TEST(ViewsWindow, ResetAllAsksThenDeletesAddOnFilesAndUnmarksEveryRow) {
   });
   QTest::mouseClick(resetAll, Qt::LeftButton);
   EXPECT_EQ(question, "Reset All will unload every loaded folder: it takes out the 1 file they "
-                      "put into the game and puts back the game's own files they replaced. It "
-                      "also deletes these 2 files from the game folder:\npic1.bmp\nreadme.txt");
+                      "put into the game and puts back the game's own files they replaced. The "
+                      "loaded folders are saved first as the setup \"Before Reset All\": "
+                      "switching to it (right-click the folder grid) loads them again. It also "
+                      "deletes these 2 files from the game folder:\npic1.bmp\nreadme.txt");
   EXPECT_TRUE(game.Exists("readme.txt"));
   EXPECT_EQ(driver.Grid()->model()->index(0, 2).data().toString(), "S");
   driver.AnswerNextBox(QMessageBox::Ok, [&] { QTest::mouseClick(resetAll, Qt::LeftButton); });
