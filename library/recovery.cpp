@@ -9,6 +9,7 @@
 #include "library/loaded_record.h"
 #include "library/reset_all.h"
 #include "library/save_files.h"
+#include "library/setups.h"
 #include "library/unplace.h"
 
 namespace fs = std::filesystem;
@@ -32,6 +33,7 @@ static void TakeOut(LibraryState &state, const Journal &journal, Caption &captio
 void FinishInterrupted(LibraryState &state, Caption &caption, Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
   RemovePartial(PartialPath(RecordPath(state)));
+  RemoveHalfWrittenSetups(state.LibDir);
   if (Journal::Pending(keeping) &&
       RefusedForLink(state, {}, "the operation cut short was not finished", failures))
     return;

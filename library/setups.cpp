@@ -152,3 +152,11 @@ bool RemoveSetup(const fs::path &libDir, std::string_view name, Failures &failur
   }
   return RemoveFile(SetupPath(libDir, name), failures);
 }
+
+void RemoveHalfWrittenSetups(const fs::path &libDir) {
+  const fs::path folder = SetupsFolder(libDir);
+  if (IsLink(KeepingFolder(libDir)) || IsLink(folder))
+    return;
+  for (const std::string &name : ListFiles(folder, "*.partial"))
+    RemovePartial(Child(folder, name));
+}

@@ -33,5 +33,7 @@ std::optional<std::vector<std::string>> ReadSetup(const std::filesystem::path &l
 // written.
 bool WriteSetup(const std::filesystem::path &libDir, std::string_view name,
                 const std::vector<std::string> &folders, Failures &failures);
+// Removes what an interrupted write of a setup left behind; nothing through a link.
+void RemoveHalfWrittenSetups(const std::filesystem::path &libDir);
 // Deletes setup `name`. False, with the reason, when there is none or it cannot be deleted.
 bool RemoveSetup(const std::filesystem::path &libDir, std::string_view name, Failures &failures);

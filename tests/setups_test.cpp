@@ -93,6 +93,10 @@ TEST_F(Setups, ResetAllSavesTheWayBackAndSwitchingUndoesIt) {
   EXPECT_TRUE(selector.DeleteSetup("before reset all", failures));
   EXPECT_EQ(selector.Setups(), Names{});
   EXPECT_FALSE(selector.DeleteSetup("Before Reset All", failures));
+  // A setup whose writing a crash cut short leaves its temporary file; the next start removes it.
+  game.Write("ZEP128/#Selector/setups/Before Reset All.txt.partial", "S-a\r\n");
+  Selector(game.Path(), caption, starter).StartUp(failures);
+  EXPECT_FALSE(game.Exists("ZEP128/#Selector/setups/Before Reset All.txt.partial"));
 }
 
 TEST_F(Setups, HostileSetupsAndNamesAreRefusedWhole) {
