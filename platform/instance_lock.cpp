@@ -24,8 +24,8 @@ std::filesystem::path LockPath(const std::filesystem::path &eawDir) {
   key = key.toLower();
 #endif
   const QByteArray hash = QCryptographicHash::hash(key.toUtf8(), QCryptographicHash::Sha1).toHex();
-  return ToPath(QDir::temp().filePath("eaw-addon-selector-" + QString::fromLatin1(hash.left(16)) +
-                                      ".lock"));
+  return ToPath(
+      QDir::temp().filePath("eaw-addon-selector-" + QString::fromLatin1(hash.left(16)) + ".lock"));
 }
 
 } // namespace

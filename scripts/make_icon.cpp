@@ -10,9 +10,9 @@
 namespace {
 
 // The 16 colours of the standard Windows palette.
-const QList<QRgb> kPalette = {0xff000000, 0xff800000, 0xff008000, 0xff808000, 0xff000080, 0xff800080,
-                              0xff008080, 0xffc0c0c0, 0xff808080, 0xffff0000, 0xff00ff00, 0xffffff00,
-                              0xff0000ff, 0xffff00ff, 0xff00ffff, 0xffffffff};
+const QList<QRgb> kPalette = {
+    0xff000000, 0xff800000, 0xff008000, 0xff808000, 0xff000080, 0xff800080, 0xff008080, 0xffc0c0c0,
+    0xff808080, 0xffff0000, 0xff00ff00, 0xffffff00, 0xff0000ff, 0xffff00ff, 0xff00ffff, 0xffffffff};
 
 void Put16(QByteArray &out, quint16 value) {
   value = qToLittleEndian(value);
@@ -27,7 +27,8 @@ void Put32(QByteArray &out, quint32 value) {
 // One icon image: a 4-bit bitmap, bottom row first, then its transparency mask.
 QByteArray IconImage(const QImage &argb) {
   const int size = argb.width();
-  const QImage indexed = argb.convertToFormat(QImage::Format_Indexed8, kPalette, Qt::ThresholdDither);
+  const QImage indexed =
+      argb.convertToFormat(QImage::Format_Indexed8, kPalette, Qt::ThresholdDither);
   QByteArray out;
   for (quint32 value : {40u, quint32(size), quint32(size * 2)})
     Put32(out, value);

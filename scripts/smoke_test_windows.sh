@@ -10,9 +10,9 @@ set -euo pipefail
 here="$(cd "$(dirname "$0")" && pwd)"
 
 # Positions in the window, in pixels from its top left corner: the layout is fixed in twips.
-world_tab=(170 14)  # the tab "World settings"
-first_row=(420 80)  # the grid's first row, under its header
-exit_button=(930 600)
+world_tab=(170 14)    # the tab "World settings"
+first_row=(420 80)    # the grid's first row, under its header
+exit_button=(958 22) # "Exit", top right
 
 wait_for() { # seconds, condition...
   local until=$((SECONDS + $1))

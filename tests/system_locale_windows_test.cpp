@@ -16,7 +16,7 @@ TEST(SystemLocale, NamesFoldAsTheFileSystemFoldsThem) {
               CSTR_EQUAL)
         << static_cast<unsigned>(c);
   }
-  EXPECT_EQ(FoldName("\xC3\xA4i"), "\xC3\x84I");    // "äi": a Turkish "i" is still "I"
+  EXPECT_EQ(FoldName("\xC3\xA4i"), "\xC3\x84I");               // "äi": a Turkish "i" is still "I"
   EXPECT_EQ(FoldName("\xC3\xA4\xC4\xB1"), "\xC3\x84\xC4\xB1"); // dotless "ı" has no upper case here
 }
 
