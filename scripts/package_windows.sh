@@ -1,7 +1,9 @@
 #!/usr/bin/env bash
 # Builds the program for Windows (Release, against the Qt of scripts/windows_qt.sh) and makes
 # eawselector-windows-x64.zip: the program, the DLLs and plugins it needs and a README.txt for
-# players, to unpack into the game folder. Then tests the zip under Wine (scripts/smoke_test_windows.sh).
+# players, to unpack into the game folder. Then tests the zip under Wine (scripts/smoke_test_windows.sh),
+# which saves a picture of the screen to SCREENSHOT when it is given.
+# Usage: package_windows.sh [SCREENSHOT.png]
 set -euo pipefail
 cd "$(dirname "$0")/.."
 bash scripts/install_deps.sh
@@ -31,4 +33,4 @@ zip="$PWD/eawselector-windows-x64.zip"
 rm -f "$zip"
 (cd "$stage" && zip -q -r -9 "$zip" .)
 echo "made $zip ($(du -k "$zip" | cut -f1) KB)"
-bash scripts/smoke_test_windows.sh "$zip"
+bash scripts/smoke_test_windows.sh "$zip" "${1:-}"

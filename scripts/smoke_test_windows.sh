@@ -40,13 +40,13 @@ drive() { # game folder, screenshot file or ""
   sleep 1
   click "${first_row[@]}"
   if ! wait_for 30 test -f "$game/demoskin.dat" -a -f "$game/Savedata/demo.msn"; then
-    [ -z "$screenshot" ] || import -window root "$screenshot"
+    [ -z "$screenshot" ] || import -window "$window" "$screenshot"
     echo "FAIL: a click on the add-on's row did not load it" >&2
     return 1
   fi
   echo "loaded: $(cd "$game" && ls demoskin.dat Savedata/demo.msn | tr '\n' ' ')"
   sleep 1
-  [ -z "$screenshot" ] || import -window root "$screenshot"
+  [ -z "$screenshot" ] || import -window "$window" "$screenshot"
   click "${first_row[@]}"
   if ! wait_for 30 test ! -e "$game/demoskin.dat" -a ! -e "$game/Savedata/demo.msn"; then
     echo "FAIL: a second click did not unload it" >&2
