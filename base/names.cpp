@@ -56,29 +56,16 @@ static bool IsAscii(std::string_view text) {
 }
 
 #ifdef _WIN32
-static std::wstring Wide(std::string_view utf8) {
-  const int size = static_cast<int>(utf8.size());
-  std::wstring wide(
-      static_cast<size_t>(MultiByteToWideChar(CP_UTF8, 0, utf8.data(), size, nullptr, 0)), L'\0');
-  MultiByteToWideChar(CP_UTF8, 0, utf8.data(), size, wide.data(), static_cast<int>(wide.size()));
-  return wide;
-}
-
-static std::string Narrow(const std::wstring &wide) {
-  const int size = static_cast<int>(wide.size());
-  std::string utf8(static_cast<size_t>(WideCharToMultiByte(CP_UTF8, 0, wide.data(), size, nullptr,
-                                                           0, nullptr, nullptr)),
-                   '\0');
-  WideCharToMultiByte(CP_UTF8, 0, wide.data(), size, utf8.data(), static_cast<int>(utf8.size()),
-                      nullptr, nullptr);
-  return utf8;
-}
-
-// The system's own upper case, which its ordinal case-insensitive comparison uses.
+// The invariant upper case, which NTFS and the system's ordinal case-insensitive comparison
+// (CompareStringOrdinal) use, whatever the user's language: a Turkish "i" stays an "I" there.
 static std::string FoldNonAscii(std::string_view name) {
-  std::wstring wide = Wide(name);
-  CharUpperBuffW(wide.data(), static_cast<DWORD>(wide.size()));
-  return Narrow(wide);
+  const std::wstring wide = WideFromBytes(name, CP_UTF8);
+  const int size = static_cast<int>(wide.size());
+  std::wstring upper(wide.size(), L'\0');
+  if (LCMapStringEx(LOCALE_NAME_INVARIANT, LCMAP_UPPERCASE, wide.data(), size, upper.data(), size,
+                    nullptr, nullptr, 0) != size)
+    return std::string(name);
+  return BytesFromWide(upper, CP_UTF8);
 }
 #else
 // Upper case of lower case is simple case folding, in upper case, for all but the Turkish dotted

@@ -4,6 +4,10 @@
 
 #include <array>
 
+#ifdef _WIN32
+#include <windows.h>
+#endif
+
 namespace {
 
 // The characters of bytes 0x80 to 0x9F; the undefined ones keep their own number.
@@ -106,8 +110,49 @@ std::string ToWindows1252(std::string_view utf8) {
   return out;
 }
 
+#ifdef _WIN32
+std::wstring WideFromBytes(std::string_view bytes, unsigned codePage) {
+  const int size = static_cast<int>(bytes.size());
+  std::wstring wide(
+      static_cast<size_t>(MultiByteToWideChar(codePage, 0, bytes.data(), size, nullptr, 0)), L'\0');
+  MultiByteToWideChar(codePage, 0, bytes.data(), size, wide.data(), static_cast<int>(wide.size()));
+  return wide;
+}
+
+std::string BytesFromWide(std::wstring_view wide, unsigned codePage) {
+  const int size = static_cast<int>(wide.size());
+  // UTF-8 takes no default character.
+  const char *unknown = codePage == CP_UTF8 ? nullptr : "?";
+  std::string bytes(static_cast<size_t>(WideCharToMultiByte(codePage, 0, wide.data(), size, nullptr,
+                                                            0, unknown, nullptr)),
+                    '\0');
+  WideCharToMultiByte(codePage, 0, wide.data(), size, bytes.data(), static_cast<int>(bytes.size()),
+                      unknown, nullptr);
+  return bytes;
+}
+
+// Windows-1252 keeps the table above, which gives back the five bytes the system leaves
+// undefined; other code pages go through the system.
+std::string AnsiToUtf8(std::string_view bytes) {
+  const unsigned codePage = GetACP();
+  if (codePage == 1252)
+    return Windows1252ToUtf8(bytes);
+  return BytesFromWide(WideFromBytes(bytes, codePage), CP_UTF8);
+}
+
+std::string ToAnsi(std::string_view utf8) {
+  const unsigned codePage = GetACP();
+  if (codePage == 1252)
+    return ToWindows1252(utf8);
+  return BytesFromWide(WideFromBytes(utf8, CP_UTF8), codePage);
+}
+#else
+std::string AnsiToUtf8(std::string_view bytes) { return Windows1252ToUtf8(bytes); }
+std::string ToAnsi(std::string_view utf8) { return ToWindows1252(utf8); }
+#endif
+
 std::string TextAsUtf8(std::string_view bytes) {
-  return IsUtf8(bytes) ? std::string(bytes) : Windows1252ToUtf8(bytes);
+  return IsUtf8(bytes) ? std::string(bytes) : AnsiToUtf8(bytes);
 }
 
 std::string NameFromText(std::string_view bytes) {

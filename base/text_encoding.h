@@ -16,8 +16,14 @@ std::string Windows1252ToUtf8(std::string_view bytes);
 // UTF-8 text as Windows-1252 bytes, the inverse of Windows1252ToUtf8; a character the code page
 // lacks becomes "?".
 std::string ToWindows1252(std::string_view utf8);
-// Text from a file written on Windows: the bytes when they are valid UTF-8, otherwise read as
-// Windows-1252 (what Notepad and older tools write) and given as UTF-8.
+// Bytes in the system's ANSI code page (what Notepad and older tools write) as UTF-8: on Windows
+// the code page the system names (GetACP), elsewhere Windows-1252.
+std::string AnsiToUtf8(std::string_view bytes);
+// UTF-8 text as bytes in the system's ANSI code page, the inverse of AnsiToUtf8; a character the
+// code page lacks becomes "?".
+std::string ToAnsi(std::string_view utf8);
+// Text from a file written on Windows: the bytes when they are valid UTF-8, otherwise read in the
+// system's ANSI code page and given as UTF-8.
 std::string TextAsUtf8(std::string_view bytes);
 // The first character of a name.
 struct FirstCharacter {
@@ -31,5 +37,11 @@ FirstCharacter FirstCharacterOf(std::string_view name);
 // valid sequence. Empty for an empty text.
 std::string LastCharacterOf(std::string_view text);
 // A file name read from a text file, as the platform keeps names: on Windows, where names are
-// UTF-8 here, Windows-1252 text becomes UTF-8; elsewhere the bytes are the name.
+// UTF-8 here, ANSI text becomes UTF-8; elsewhere the bytes are the name.
 std::string NameFromText(std::string_view bytes);
+
+#ifdef _WIN32
+// Bytes in Windows code page `codePage` as UTF-16, and back; what a code page lacks becomes "?".
+std::wstring WideFromBytes(std::string_view bytes, unsigned codePage);
+std::string BytesFromWide(std::wstring_view wide, unsigned codePage);
+#endif

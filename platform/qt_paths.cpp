@@ -19,17 +19,17 @@ QString FromName(const std::string &name) { return QFile::decodeName(name.c_str(
 std::string ToName(const QString &text) { return QFile::encodeName(text).toStdString(); }
 #endif
 
-QString FromText(const std::string &bytes, bool *windows1252) {
+QString FromText(const std::string &bytes, bool *ansi) {
   const bool utf8 = IsUtf8(bytes);
-  if (windows1252)
-    *windows1252 = !utf8;
-  const std::string text = utf8 ? bytes : Windows1252ToUtf8(bytes);
+  if (ansi)
+    *ansi = !utf8;
+  const std::string text = utf8 ? bytes : AnsiToUtf8(bytes);
   // A byte-order mark is part of the file, so it stays in the text.
   QStringDecoder decoder(QStringDecoder::Utf8, QStringConverter::Flag::ConvertInitialBom);
   return decoder(QByteArrayView(text.data(), static_cast<qsizetype>(text.size())));
 }
 
-std::string ToText(const QString &text, bool windows1252) {
+std::string ToText(const QString &text, bool ansi) {
   const std::string utf8 = text.toStdString();
-  return windows1252 ? ToWindows1252(utf8) : utf8;
+  return ansi ? ToAnsi(utf8) : utf8;
 }

@@ -5,7 +5,10 @@
 #         Windows compiler and Wine for the Windows tests (scripts/test.sh)
 set -euo pipefail
 demo=(cmake g++ make qt6-base-dev fonts-liberation2)
-test=(libgtest-dev xvfb xauth g++-mingw-w64-x86-64-posix wine64)
+# The Windows tests also build Qt for Windows from Debian's source (dpkg-dev, ninja-build), run
+# the packaged program under Xvfb and drive it (xdotool), and pack it (zip, unzip).
+test=(libgtest-dev xvfb xauth g++-mingw-w64-x86-64-posix wine64 locales xdotool dpkg-dev
+  ninja-build zip unzip)
 case "${1:-test}" in
 demo) packages=("${demo[@]}") ;;
 test) packages=("${demo[@]}" "${test[@]}") ;;
@@ -14,13 +17,19 @@ test) packages=("${demo[@]}" "${test[@]}") ;;
   exit 2
   ;;
 esac
+sudo=""
+[ "$(id -u)" -eq 0 ] || sudo="sudo"
 missing=()
 for p in "${packages[@]}"; do
   dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q "install ok installed" || missing+=("$p")
 done
 if [ ${#missing[@]} -gt 0 ]; then
-  sudo=""
-  [ "$(id -u)" -eq 0 ] || sudo="sudo"
   $sudo apt-get update
   DEBIAN_FRONTEND=noninteractive $sudo apt-get install -y "${missing[@]}"
 fi
+[ "${1:-test}" = test ] || exit 0
+# Wine takes the system's language and ANSI code page from the Linux locale; the Windows tests
+# run under these three.
+for locale in en_US ru_RU tr_TR; do
+  locale -a | grep -qx "$locale.utf8" || $sudo localedef -i "$locale" -f UTF-8 "$locale.UTF-8"
+done

@@ -1,5 +1,6 @@
 #include "app/category_file.h"
 #include "platform/instance_lock.h"
+#include "platform/qt_paths.h"
 #include "tests/game_folder.h"
 #include "tests/window_driver.h"
 #include "ui/duplicate_instance.h"
@@ -10,6 +11,7 @@
 #include <QLabel>
 #include <QMessageBox>
 #include <QPlainTextEdit>
+#include <QProcess>
 #include <QPushButton>
 #include <QTest>
 #include <QTimer>
@@ -133,6 +135,20 @@ TEST(StartupWindow, SecondInstanceIsRefusedAndTouchesNoFile) {
   EXPECT_EQ(icon, QMessageBox::Warning);
   EXPECT_EQ(buttons, 1);
   EXPECT_TRUE(fs::is_empty(game.Path()));
+}
+
+// The system releases the lock of an instance that is killed, whatever process ids are reused.
+TEST(StartupWindow, AKilledInstanceLeavesNoLockBehind) {
+  GameFolder game;
+  QProcess holder;
+  holder.start(QCoreApplication::applicationFilePath(),
+               {"--hold-instance-lock", FromPath(game.Path())});
+  ASSERT_TRUE(holder.waitForReadyRead(60000));
+  ASSERT_EQ(holder.readAll().trimmed(), "held");
+  EXPECT_FALSE(InstanceLock(game.Path()).Acquired());
+  holder.kill();
+  ASSERT_TRUE(holder.waitForFinished(60000));
+  EXPECT_TRUE(InstanceLock(game.Path()).Acquired());
 }
 
 TEST(StartupWindow, AHugeCategoryFileGivesABoxThatFitsTheScreen) {
