@@ -8,6 +8,7 @@
 #ifdef _WIN32
 #include <windows.h>
 #else
+#include <cerrno>
 #include <dirent.h>
 #include <sys/stat.h>
 #endif
@@ -101,14 +102,19 @@ enum class Kind { File, HiddenFile, Folder, Other };
 #ifdef _WIN32
 // Calls `visit` with each entry's name and kind, from one search; hidden and system files are
 // told apart, as they are no files to the game.
-void ForEachEntry(const fs::path &folder,
-                  const std::function<void(std::string &&name, Kind kind)> &visit) {
+std::error_code ForEachEntry(const fs::path &folder,
+                             const std::function<void(std::string &&name, Kind kind)> &visit) {
   WIN32_FIND_DATAW found;
   // The basic form leaves out the short names, and large fetches take fewer trips to the disk.
   const HANDLE search = FindFirstFileExW((folder / L"*").c_str(), FindExInfoBasic, &found,
                                          FindExSearchNameMatch, nullptr, FIND_FIRST_EX_LARGE_FETCH);
-  if (search == INVALID_HANDLE_VALUE)
-    return;
+  if (search == INVALID_HANDLE_VALUE) {
+    const DWORD error = GetLastError();
+    // Only a drive's root can hold no entry at all, not even "." and "..".
+    if (error == ERROR_FILE_NOT_FOUND)
+      return {};
+    return std::error_code(static_cast<int>(error), std::system_category());
+  }
   do {
     const DWORD attributes = found.dwFileAttributes;
     const std::wstring_view name = found.cFileName;
@@ -121,6 +127,7 @@ void ForEachEntry(const fs::path &folder,
     visit(NameText(fs::path(found.cFileName)), kind);
   } while (FindNextFileW(search, &found));
   FindClose(search);
+  return {};
 }
 #else
 // The kind of an entry, following a link as the game would; the listing tells it without a
@@ -138,17 +145,18 @@ Kind KindOf(int folder, const dirent &entry) {
   return S_ISREG(info.st_mode) ? Kind::File : S_ISDIR(info.st_mode) ? Kind::Folder : Kind::Other;
 }
 
-void ForEachEntry(const fs::path &folder,
-                  const std::function<void(std::string &&name, Kind kind)> &visit) {
+std::error_code ForEachEntry(const fs::path &folder,
+                             const std::function<void(std::string &&name, Kind kind)> &visit) {
   DIR *listing = ::opendir(folder.c_str());
   if (!listing)
-    return;
+    return std::error_code(errno, std::generic_category());
   while (const dirent *entry = ::readdir(listing)) {
     const std::string_view name = entry->d_name;
     if (name != "." && name != "..")
       visit(std::string(name), KindOf(::dirfd(listing), *entry));
   }
   ::closedir(listing);
+  return {};
 }
 #endif
 
@@ -159,27 +167,31 @@ void SortNames(std::vector<std::string> &names) {
 
 } // namespace
 
-void ForEachFile(const fs::path &folder, const std::function<void(std::string &&name)> &visit,
-                 FileKinds kinds) {
-  ForEachEntry(folder, [&](std::string &&name, Kind kind) {
+std::error_code ForEachFile(const fs::path &folder,
+                            const std::function<void(std::string &&name)> &visit, FileKinds kinds) {
+  return ForEachEntry(folder, [&](std::string &&name, Kind kind) {
     if (kind == Kind::File || (kind == Kind::HiddenFile && kinds == FileKinds::WithHidden))
       visit(std::move(name));
   });
 }
 
-std::vector<std::string> ListFiles(const fs::path &folder, std::string_view patterns,
-                                   FileKinds kinds) {
-  std::vector<std::string> names;
+FileListing ListFilesOrReason(const fs::path &folder, std::string_view patterns, FileKinds kinds) {
+  FileListing listing;
   const PatternList wanted(patterns);
-  ForEachFile(
+  listing.error = ForEachFile(
       folder,
       [&](std::string &&name) {
         if (wanted.Matches(name))
-          names.push_back(std::move(name));
+          listing.names.push_back(std::move(name));
       },
       kinds);
-  SortNames(names);
-  return names;
+  SortNames(listing.names);
+  return listing;
+}
+
+std::vector<std::string> ListFiles(const fs::path &folder, std::string_view patterns,
+                                   FileKinds kinds) {
+  return ListFilesOrReason(folder, patterns, kinds).names;
 }
 
 std::vector<std::string> ListFolderNames(const fs::path &folder) {

@@ -4,6 +4,7 @@
 #include <functional>
 #include <string>
 #include <string_view>
+#include <system_error>
 #include <vector>
 
 // Whether `name` matches the wildcard `pattern` ("*" any run, "?" one character), ignoring case;
@@ -16,15 +17,24 @@ bool MatchesPatternList(std::string_view name, std::string_view patterns);
 enum class FileKinds { Shown, WithHidden };
 // Calls `visit` with the name of each plain file directly in `folder` (on Windows, the hidden and
 // system ones only `WithHidden`), in the order the file system gives them. A folder that cannot
-// be listed gives no names.
-void ForEachFile(const std::filesystem::path &folder,
-                 const std::function<void(std::string &&name)> &visit,
-                 FileKinds kinds = FileKinds::Shown);
+// be listed gives no names; the reason is returned.
+std::error_code ForEachFile(const std::filesystem::path &folder,
+                            const std::function<void(std::string &&name)> &visit,
+                            FileKinds kinds = FileKinds::Shown);
 // Plain file names (no path) directly in `folder` that match the pattern list, in name order.
 // A folder that cannot be listed gives no names.
 std::vector<std::string> ListFiles(const std::filesystem::path &folder,
                                    std::string_view patterns = "*.*",
                                    FileKinds kinds = FileKinds::Shown);
+// The files of a folder, or why it could not be listed.
+struct FileListing {
+  std::vector<std::string> names;
+  std::error_code error;
+};
+// As ListFiles, but a folder that cannot be listed says why instead of looking empty.
+FileListing ListFilesOrReason(const std::filesystem::path &folder,
+                              std::string_view patterns = "*.*",
+                              FileKinds kinds = FileKinds::Shown);
 // The names of the immediate subfolders of `folder`, in name order.
 std::vector<std::string> ListFolderNames(const std::filesystem::path &folder);
 // Full paths of the immediate subfolders of `folder`, in name order.

@@ -48,12 +48,15 @@ int LastLoaded(const FolderGrid &grid, const std::string &letter) {
 // that were can still be unloaded. Returns the loaded folders whose files it replaced.
 std::vector<std::string> Load(LibraryState &state, int row, Caption &caption, Failures &failures) {
   const size_t before = failures.Lines().size();
-  const std::vector<std::string> overwritten =
+  const std::optional<std::vector<std::string>> overwritten =
       MoveIn(state, state.Unigrid.PathOf(row), caption, failures);
+  // A folder that was not loaded at all is not marked: there is nothing to unload.
+  if (!overwritten)
+    return {};
   MarkLoaded(state, row);
   SaveLoaded(state, failures);
   if (!state.Ready)
-    return overwritten;
+    return *overwritten;
   Journal::Remove(KeepingFolder(state.LibDir));
   if (failures.Lines().size() > before)
     failures.SetHeading("\"" + state.Unigrid.Row(row).name +
@@ -61,7 +64,7 @@ std::vector<std::string> Load(LibraryState &state, int row, Caption &caption, Fa
                         "each with the reason. Mend what the reasons say (free some disk space, "
                         "close the game if it is running), then unload the folder and load it "
                         "again.");
-  return overwritten;
+  return *overwritten;
 }
 
 // At most one campaign is loaded; loading another first unloads the loaded one, which carries

@@ -3,6 +3,7 @@
 #include "base/file_ops.h"
 #include "base/listing.h"
 #include "base/names.h"
+#include "base/new_file.h"
 #include "base/plain_name.h"
 #include "base/progress_meter.h"
 #include "library/file_rules.h"
@@ -106,15 +107,21 @@ void PutOriginalBack(const fs::path &kept, const fs::path &destination, Failures
 
 } // namespace
 
-std::vector<std::string> MoveIn(LibraryState &state, const fs::path &folder, Caption &caption,
-                                Failures &failures) {
+std::optional<std::vector<std::string>> MoveIn(LibraryState &state, const fs::path &folder,
+                                               Caption &caption, Failures &failures) {
   if (!state.Ready || folder == state.EAWDir)
-    return {};
+    return std::vector<std::string>{};
   CaptionRestorer restorer(caption);
   const fs::path keeping = KeepingFolder(state.LibDir);
   Ledger ledger = Ledger::Read(keeping, failures);
   const std::string name = NameText(folder);
-  const std::vector<std::string> files = ListFiles(folder);
+  const FileListing listing = ListFilesOrReason(folder);
+  if (listing.error) {
+    failures.Add(folder,
+                 "was not loaded: it cannot be listed (" + ReasonFor(folder, listing.error) + ")");
+    return std::nullopt;
+  }
+  const std::vector<std::string> &files = listing.names;
   GamePlaces places(state.EAWDir, files);
   std::set<std::string> overwritten;
   const std::vector<Copy> copies =
@@ -126,7 +133,7 @@ std::vector<std::string> MoveIn(LibraryState &state, const fs::path &folder, Cap
   if (!journal.Write(keeping, failures)) {
     failures.Add(folder, "was not loaded: the program cannot note what it is doing in " +
                              DisplayPath(keeping));
-    return {};
+    return std::nullopt;
   }
   LoadedFolder loaded{name, {}};
   std::uint64_t bytes = 0;
@@ -155,5 +162,5 @@ std::vector<std::string> MoveIn(LibraryState &state, const fs::path &folder, Cap
   journal.step = Journal::Step::Loaded;
   journal.entries.clear();
   journal.Write(keeping, failures);
-  return {overwritten.begin(), overwritten.end()};
+  return std::vector<std::string>(overwritten.begin(), overwritten.end());
 }

@@ -5,6 +5,7 @@
 #include "library/library_state.h"
 
 #include <filesystem>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -16,6 +17,9 @@
 // kept, the original goes back at once. The
 // journal is left at "loaded" for the caller to close once the record is written. Does nothing
 // while `Ready` is false or when `folder` is the game folder. A file that cannot be copied is
-// skipped and recorded in `failures`. Returns the loaded folders whose files it replaced.
-std::vector<std::string> MoveIn(LibraryState &state, const std::filesystem::path &folder,
-                                Caption &caption, Failures &failures);
+// skipped and recorded in `failures`. Returns the loaded folders whose files it replaced; nothing,
+// with the reason in `failures`, when the folder was not loaded at all (it cannot be listed, or
+// the journal cannot be written).
+std::optional<std::vector<std::string>> MoveIn(LibraryState &state,
+                                               const std::filesystem::path &folder,
+                                               Caption &caption, Failures &failures);

@@ -89,6 +89,14 @@ TEST(MoveIn, FileThatCannotBeCopiedIsSkippedAndReported) {
     EXPECT_NE(message.find(Upper(failed)), std::string::npos) << failed;
 }
 
+TEST(MoveIn, AFolderThatCannotBeListedIsNotLoadedAndSaysWhy) {
+  Game game;
+  game.folder.Write("ZEP128/S-File"); // a file where the folder was: it cannot be listed
+  EXPECT_FALSE(MoveIn(game.state, game.folder.Library() / "S-File", game.caption, game.failures));
+  EXPECT_NE(game.failures.Message("").find("cannot be listed"), std::string::npos);
+  EXPECT_FALSE(game.folder.Exists("ZEP128/#Selector/journal.txt"));
+}
+
 TEST(MoveOut, DeletesOnlyTheCopiesLoadingMade) {
   Game game;
   for (const char *name : {"a.msn", "c.bgm", "planes.dat", "gone.dat", "dup.dat", "contents.txt",

@@ -78,3 +78,15 @@ TEST(Reasons, AFullDiskAHeldFileAndNamesWindowsCannotKeepAreCalledSo) {
   ASSERT_EQ(failures.Lines().size(), 1u);
   EXPECT_NE(failures.Lines()[0].find("cannot be loaded: it has " + dotted), std::string::npos);
 }
+
+TEST_F(Refusals, AFolderThatCouldNotBeLoadedAtAllIsNotMarkedLoaded) {
+  game.WithCategories("Skins: S\r\n");
+  game.Addon("S-a", {"a.dat"});
+  selector.StartUp(failures);
+  game.MakeFolder("ZEP128/#Selector/journal.txt.partial"); // the journal cannot be written
+  selector.ClickRow(RowOf(selector.State().Unigrid, "S-a"), failures);
+  EXPECT_FALSE(IsLoaded(selector.State().Unigrid.Row(RowOf(selector.State().Unigrid, "S-a"))));
+  EXPECT_FALSE(game.Exists("a.dat"));
+  EXPECT_EQ(game.Record(), "");
+  EXPECT_NE(failures.Message("").find("was not loaded"), std::string::npos);
+}
