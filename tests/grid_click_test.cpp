@@ -1,5 +1,4 @@
 #include "app/selector.h"
-#include "library/grid_click.h"
 #include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>

@@ -46,7 +46,7 @@ TEST(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   EXPECT_EQ(state.Unigrid.Row(0).name, "Only one selection can be made!");
   EXPECT_EQ(state.summary, "Refresh: 4 folders, 2 new, 1 gone");
   EXPECT_EQ(state.Codes, (Names{"S"}));
-  EXPECT_EQ(state.HoverRow, -1);
+  EXPECT_EQ(state.hoveredRow, -1);
   EXPECT_TRUE(state.Ready);
   EXPECT_EQ(ListFiles(game.Path()), (Names{"planes.dat"}));
   EXPECT_EQ(game.Read("planes.dat"), "planes");

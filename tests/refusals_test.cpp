@@ -74,7 +74,7 @@ TEST(Reasons, AFullDiskAHeldFileAndNamesWindowsCannotKeepAreCalledSo) {
   state.Unigrid.rows.push_back(GridRow{"S-odd.", "", 0, kRowHeight});
   RecordingCaption caption;
   Failures failures;
-  ClickRow(state, 1, caption, failures);
+  library::ClickRow(state, 1, caption, failures);
   ASSERT_EQ(failures.Lines().size(), 1u);
   EXPECT_NE(failures.Lines()[0].find("cannot be loaded: it has " + dotted), std::string::npos);
 }
