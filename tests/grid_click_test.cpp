@@ -12,7 +12,6 @@ protected:
   const GridRow &Row(const std::string &name) const {
     return State().Unigrid.Row(RowOf(State().Unigrid, name));
   }
-  void Click(const std::string &name) { selector.ClickRow(RowOf(State().Unigrid, name), failures); }
 };
 
 } // namespace

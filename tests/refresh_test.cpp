@@ -1,7 +1,7 @@
 #include "app/category_file.h"
 #include "app/selector.h"
 #include "base/listing.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
@@ -9,16 +9,13 @@ namespace fs = std::filesystem;
 
 using Names = std::vector<std::string>;
 
-TEST(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
-  GameFolder game;
+using Refresh = SelectorTest;
+
+TEST_F(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   game.Write("planes.dat", "planes");
   for (const char *name : {"F-Spit", "S-Camo", "G-Sky", "unused"})
     game.Write(std::string("ZEP128/") + name + "/planes.dat", "addon");
-  RecordingCaption caption;
-  NotingStarter starter;
-  Selector selector(game.Path(), caption, starter);
   const SelectorState &state = selector.State();
-  Failures failures;
   // The category list is read at start-up only: a refresh keeps its letters.
   game.WithCategories("Skins: S\r\n");
   selector.StartUp(failures);

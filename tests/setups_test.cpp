@@ -28,9 +28,6 @@ protected:
     game.Write("orig.dat", "the game's");
     selector.StartUp(failures);
   }
-  std::string Click(const std::string &name) {
-    return selector.ClickRow(RowOf(selector.State().Unigrid, name), failures);
-  }
   Names Loaded() { return selector.LoadedFolderNames(failures); }
   std::string Setup(const std::string &name) {
     return game.Read("ZEP128/#Selector/setups/" + name + ".txt");
