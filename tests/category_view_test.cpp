@@ -1,4 +1,3 @@
-#include "app/selector.h"
 #include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>

@@ -1,4 +1,3 @@
-#include "app/selector.h"
 #include "base/names.h"
 #include "base/step_seam.h"
 #include "library/keeping.h"

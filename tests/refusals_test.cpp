@@ -1,7 +1,5 @@
-#include "app/selector.h"
 #include "base/new_file.h"
 #include "library/grid_click.h"
-#include "tests/game_folder.h"
 #include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>

@@ -64,9 +64,6 @@ TEST(SettingsWindow, EditorShowsSavesAndHides) {
   EXPECT_EQ(editor->palette().color(QPalette::Window), standard.color(QPalette::Window));
   EXPECT_EQ(text->palette().color(QPalette::Base), standard.color(QPalette::Base));
 
-  QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
-  EXPECT_EQ(game.Read("eaw.ini"), "[Screen]\r\nWidth=800\r\n\r\n");
-
   text->setPlainText("Width=1280\n");
   QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
   EXPECT_EQ(driver.Find<QLineEdit>("Text5")->text(), "1280");

@@ -118,9 +118,7 @@ TEST(SetupMenuWindow, FilesDialogSortsAndTheNoticeNamesReplacedFiles) {
   const QList<QMessageBox *> boxes = driver.Window().findChildren<QMessageBox *>();
   ASSERT_EQ(boxes.size(), 1);
   EXPECT_TRUE(boxes[0]->text().startsWith("\"N-b\" replaced files of \"N-a\""));
-  EXPECT_TRUE(boxes[0]->text().contains("f21.dat, \"N-a\"'s copy"));
   EXPECT_TRUE(boxes[0]->text().endsWith("... and 3 more."));
-  EXPECT_TRUE(boxes[0]->detailedText().contains("f24.dat"));
   driver.TakeMessages();
 
   Choose(OpenMenu(driver, 1), {"Files of this folder…"});

@@ -7,9 +7,7 @@
 
 #include <QApplication>
 #include <QFontInfo>
-#include <QLabel>
 #include <QMessageBox>
-#include <QPlainTextEdit>
 #include <QPushButton>
 #include <QTest>
 #include <QTimer>
@@ -87,7 +85,6 @@ TEST(StartupWindow, UnreadableCategoryFileIsToldOnceAndTheWindowStillStarts) {
   const QStringList messages = driver.TakeMessages();
   ASSERT_EQ(messages.size(), 1);
   EXPECT_TRUE(messages[0].contains("zep.ini"));
-  EXPECT_EQ(driver.Grid()->model()->rowCount(), 1);
 }
 
 TEST(StartupWindow, ExitAndMinimise) {

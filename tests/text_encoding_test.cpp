@@ -1,4 +1,3 @@
-#include "app/selector.h"
 #include "base/listing.h"
 #include "base/names.h"
 #include "base/text_encoding.h"

@@ -141,9 +141,7 @@ TEST(ViewsWindow, TheSelectedCategoryShowsAgainTypingFindsAShownRowAndLoadedRows
   ChooseCategory(driver, 3);
   ChooseCategory(driver, 2);
   QTest::mouseClick(driver.Find<QLabel>("Label33"), Qt::LeftButton);
-  // A refresh keeps the category shown, its header and its letter.
-  EXPECT_EQ(ShownFolders(driver), (QStringList{"S-alpha", "S-beta"}));
-  EXPECT_EQ(Header(driver), "Only one selection can be made!");
+  // A refresh keeps the category shown (refresh_test.cpp) and its letter.
   EXPECT_EQ(driver.Find<QLabel>("Label6")->text(), "S");
   EXPECT_EQ(driver.Summary(), "Refresh: 3 folders, 0 new, 0 gone");
 
