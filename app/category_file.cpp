@@ -48,8 +48,7 @@ std::string DefaultCategoryText() {
 fs::path CategoryPath(const fs::path &libDir) { return FindAnyCase(libDir, "zep.ini"); }
 
 void EnsureCategoryFile(const fs::path &libDir, Failures &failures) {
-  FileCheck(CategoryPath(libDir));
-  if (!FileFound)
+  if (!FileCheck(CategoryPath(libDir)))
     WriteAtomically(CategoryPath(libDir), DefaultCategoryText(), failures);
 }
 
@@ -84,8 +83,7 @@ std::vector<std::string> SkippedLinesMessage(const std::vector<SkippedLine> &ski
 }
 
 Categories LibraryCategories(const fs::path &libDir, Failures &failures) {
-  FileCheck(CategoryPath(libDir));
-  return FileFound ? ReadCategories(libDir, failures) : DefaultCategories();
+  return FileCheck(CategoryPath(libDir)) ? ReadCategories(libDir, failures) : DefaultCategories();
 }
 
 Categories DefaultCategories() { return ParseCategories(SplitLines(DefaultCategoryText())); }

@@ -96,7 +96,7 @@ std::string Selector::ClickRow(int row, Failures &failures) {
   state_.summary.clear();
   const bool folderRow = state_.Unigrid.IsFolderRow(row);
   const bool wasLoaded = folderRow && IsLoaded(state_.Unigrid.Row(row));
-  const std::vector<std::string> replaced = ::ClickRow(state_, row, caption_, failures);
+  const std::vector<std::string> replaced = library::ClickRow(state_, row, caption_, failures);
   if (!folderRow || wasLoaded == IsLoaded(state_.Unigrid.Row(row)))
     return "";
   const std::string &name = state_.Unigrid.Row(row).name;
@@ -142,7 +142,7 @@ void Selector::RefreshLibrary(Failures &failures) {
   EnsureRecord(state_, failures);
   ReplayRecord(state_, caption_, failures);
   // The rows under the pointer are other folders now, so the next move rebuilds the preview.
-  state_.HoverRow = -1;
+  state_.hoveredRow = -1;
   ShowCategory(state_.shownCategory);
   state_.Ready = true;
   state_.summary = RefreshSummary(before, FolderNames(state_.Unigrid));
@@ -170,9 +170,9 @@ void Selector::ResetAll(const std::vector<std::string> &names, Failures &failure
 }
 
 std::optional<FolderPreview> Selector::HoverRow(int row) {
-  if (row == state_.HoverRow)
+  if (row == state_.hoveredRow)
     return std::nullopt;
-  state_.HoverRow = row;
+  state_.hoveredRow = row;
   return PreviewOfRow(state_, row);
 }
 

@@ -14,6 +14,9 @@
 #include <string>
 #include <vector>
 
+// The key code of Enter, which acts on a grid row as a click.
+inline constexpr int kEnterKey = 13;
+
 // What the program can do, for one game folder: the window calls these verbs and draws State().
 // Every verb records what it could not do in `failures` and finishes the rest.
 class Selector {
@@ -55,7 +58,7 @@ public:
   // over that row.
   std::optional<FolderPreview> HoverRow(int row);
   // The pointer left the grid and the preview was cleared: the next row entered shows again.
-  void LeaveGrid() { state_.HoverRow = -1; }
+  void LeaveGrid() { state_.hoveredRow = -1; }
   // The six settings of eaw.ini as the boxes show them.
   IniValues ReadSettings(Failures &failures);
   // Writes the six box texts into eaw.ini; the summary says how many were saved.

@@ -12,7 +12,7 @@ struct SelectorState : LibraryState {
   std::vector<std::string> Codes; // Codes[k] is the letter of List3 entry k + 2
   std::filesystem::path BackPic;  // empty when there is no background picture
   std::filesystem::path NewPic;   // the General Settings page's picture; empty for none
-  int HoverRow = -1;
-  int shownCategory = 0; // the category list entry the grid shows
-  std::string summary;   // the line that sums up the last action; empty for none
+  int hoveredRow = -1;            // the grid row whose preview is shown; -1 for none
+  int shownCategory = 0;          // the category list entry the grid shows
+  std::string summary;            // the line that sums up the last action; empty for none
 };

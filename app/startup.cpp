@@ -10,8 +10,7 @@
 namespace fs = std::filesystem;
 
 std::vector<SkippedLine> PrepareLibrary(SelectorState &state, Failures &failures) {
-  FolderCheck(state.LibDir);
-  if (!FolderFound) {
+  if (!FolderCheck(state.LibDir)) {
     std::error_code error;
     fs::create_directory(state.LibDir, error);
     if (error)
@@ -32,6 +31,5 @@ void BuildGrid(LibraryState &state, const std::vector<std::string> &codes) {
 
 fs::path GamePicture(const fs::path &eawDir, const char *name) {
   const fs::path picture = FindAnyCase(eawDir, name);
-  FileCheck(picture);
-  return FileFound ? picture : fs::path();
+  return FileCheck(picture) ? picture : fs::path();
 }

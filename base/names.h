@@ -21,8 +21,6 @@ std::string Upper(std::string_view text);
 std::string FoldName(std::string_view name);
 // The name a file gets when created as `name`: Windows drops trailing blanks and dots.
 std::string StoredName(std::string_view name);
-bool EndsWith(std::string_view text, std::string_view tail);
-bool StartsWith(std::string_view text, std::string_view head);
 // Case-insensitive name order, ties broken by the exact bytes, the same on every platform.
 bool NameLess(std::string_view a, std::string_view b);
 // Every entry of `folder` whose name equals `name` in any letter case.

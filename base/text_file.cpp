@@ -66,8 +66,7 @@ std::optional<std::vector<std::string>> ReadLines(const fs::path &path, Failures
 std::optional<std::vector<std::string>> ReadLinesIfExists(const fs::path &path, Failures &failures,
                                                           Encoding encoding,
                                                           std::uintmax_t maxBytes) {
-  FileCheck(path);
-  if (!FileFound)
+  if (!FileCheck(path))
     return std::nullopt;
   return ReadLines(path, failures, encoding, maxBytes);
 }

@@ -41,16 +41,16 @@ std::string ShowCategory(FolderGrid &grid, const std::vector<std::string> &codes
   if (k < 0)
     return "";
   grid.rows[0].name = kAllFoldersText;
-  if (k == 0) {
+  if (k == kShowAllEntry) {
     ShowAll(grid);
     return "";
   }
-  if (k == 1) {
+  if (k == kShowSelectionsEntry) {
     ShowSelections(grid);
     return "";
   }
   // An entry past the known categories has no letter, so it shows no folder.
-  const size_t index = static_cast<size_t>(k - 2);
+  const size_t index = static_cast<size_t>(k - kFirstCategoryEntry);
   const std::string letter = index < codes.size() ? codes[index] : "";
   ShowLetter(grid, letter);
   return letter;

@@ -6,18 +6,18 @@
 
 bool StaysInLibrary(std::string_view name) {
   const std::string upper = Upper(name);
-  return StartsWith(upper, "ECA") || EndsWith(upper, ".LDR") || EndsWith(upper, ".JPG") ||
-         EndsWith(upper, ".PCX") || EndsWith(upper, ".GIF") || upper == "MYPIC" ||
-         upper == "CONTENTS.TXT" || EndsWith(upper, ".PARTIAL");
+  return upper.starts_with("ECA") || upper.ends_with(".LDR") || upper.ends_with(".JPG") ||
+         upper.ends_with(".PCX") || upper.ends_with(".GIF") || upper == "MYPIC" ||
+         upper == "CONTENTS.TXT" || upper.ends_with(".PARTIAL");
 }
 
-bool IsSaveFile(std::string_view name) { return EndsWith(Upper(name), ".SVE"); }
+bool IsSaveFile(std::string_view name) { return Upper(name).ends_with(".SVE"); }
 
 Place PlaceOf(std::string_view name) {
   const std::string upper = Upper(name);
-  if (EndsWith(upper, ".MSN") || EndsWith(upper, ".SVE"))
+  if (upper.ends_with(".MSN") || upper.ends_with(".SVE"))
     return Place::Savedata;
-  if (EndsWith(upper, ".BGM"))
+  if (upper.ends_with(".BGM"))
     return Place::Music;
   return Place::Game;
 }

@@ -126,6 +126,8 @@ std::vector<std::string> ClickOther(LibraryState &state, int clicked, Caption &c
 
 } // namespace
 
+namespace library {
+
 std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption,
                                   Failures &failures) {
   state.Unigrid.currentRow = row;
@@ -134,14 +136,14 @@ std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption
   const GridRow &clicked = state.Unigrid.Row(row);
   if (state.Ready && !IsLoaded(clicked)) {
     const fs::path folder = state.Unigrid.PathOf(row);
-    FolderCheck(folder);
+    const bool found = FolderCheck(folder);
     // Windows lists a folder whose name it cannot keep, but finds no folder of that name.
     const std::string odd = WindowsNameProblem(clicked.name);
-    if (!FolderFound && !odd.empty()) {
+    if (!found && !odd.empty()) {
       failures.Add(folder, "cannot be loaded: it has " + odd);
       return {};
     }
-    if (!FolderFound) {
+    if (!found) {
       failures.Add(folder, "is no longer in the library, so nothing was loaded "
                            "(\"Refresh!\" shows the library as it is now)");
       return {};
@@ -157,8 +159,4 @@ std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption
   return ClickOther(state, row, caption, failures);
 }
 
-void PressKeyOnRow(LibraryState &state, int row, int key, Caption &caption, Failures &failures) {
-  state.Unigrid.currentRow = row;
-  if (key == kEnterKey)
-    ClickRow(state, row, caption, failures);
-}
+} // namespace library

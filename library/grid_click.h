@@ -7,8 +7,7 @@
 #include <string>
 #include <vector>
 
-// The key code of Enter.
-inline constexpr int kEnterKey = 13;
+namespace library {
 
 // A click on grid row `row`, which becomes the current row: loads a folder that is not loaded,
 // unloads one that is, keeping the campaign and single-selection rules, and drives the slot grid
@@ -18,5 +17,5 @@ inline constexpr int kEnterKey = 13;
 // whose files the load replaced.
 std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption,
                                   Failures &failures);
-// A key pressed on grid row `row`: Enter acts as a click on it, other keys do nothing.
-void PressKeyOnRow(LibraryState &state, int row, int key, Caption &caption, Failures &failures);
+
+} // namespace library

@@ -43,12 +43,12 @@ Ledger LedgerFromRecord(const LibraryState &state, const std::vector<std::string
   for (const std::string &line : recorded) {
     // A record written in Windows-1252 names the folders that UTF-8 names differently.
     std::string name = NameFromText(line);
-    FolderCheck(Child(state.LibDir, name));
-    if (!FolderFound) {
+    bool found = FolderCheck(Child(state.LibDir, name));
+    if (!found) {
       name = TextAsUtf8(line);
-      FolderCheck(Child(state.LibDir, name));
+      found = FolderCheck(Child(state.LibDir, name));
     }
-    if (FolderFound && seen.insert(name).second)
+    if (found && seen.insert(name).second)
       ledger.Append(FoundCopies(state.EAWDir, Child(state.LibDir, name)));
   }
   return ledger;
@@ -95,8 +95,7 @@ void FollowLedger(const LibraryState &state, const Ledger &ledger,
 void MendRecordFromLedger(LibraryState &state, Caption &caption, Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
   const std::vector<std::string> recorded = ReadLoadedNames(state, failures);
-  FolderCheck(keeping);
-  if (!FolderFound) {
+  if (!FolderCheck(keeping)) {
     if (recorded.empty())
       return;
     const Ledger ledger = LedgerFromRecord(state, recorded);

@@ -57,7 +57,6 @@ void SetRecorded(const LibraryState &state, const std::string &name, bool loaded
 }
 
 void EnsureRecord(const LibraryState &state, Failures &failures) {
-  FileCheck(RecordPath(state));
-  if (!FileFound)
+  if (!FileCheck(RecordPath(state)))
     WriteAtomically(RecordPath(state), "", failures);
 }

@@ -27,7 +27,7 @@ void ReplayRecord(LibraryState &state, Caption &caption, Failures &failures) {
     for (int row : rows) {
       grid.Row(row).mark.clear();
       grid.ColourRow(row, kLoadedColour);
-      ClickRow(state, row, caption, failures);
+      library::ClickRow(state, row, caption, failures);
     }
     recorded.insert(recorded.end(), rows.begin(), rows.end());
   }

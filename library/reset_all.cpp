@@ -79,8 +79,7 @@ void RestoreOriginals(LibraryState &state, Failures &failures) {
     for (const std::string &name : ListFiles(kept, "*.*", FileKinds::WithHidden)) {
       const fs::path target = Child(places.Folder(place), name);
       // A saved game of that name is the player's progress since: both stay.
-      FileCheck(target);
-      if (IsSaveFile(name) && FileFound)
+      if (IsSaveFile(name) && FileCheck(target))
         continue;
       if (MoveReplacing(Child(kept, name), target, failures))
         ++state.tally.restored;

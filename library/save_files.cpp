@@ -13,7 +13,7 @@ namespace fs = std::filesystem;
 
 bool IsCampaignFolder(const fs::path &folder) {
   const std::string name = NameText(folder);
-  return StartsWith(name, "C ") || StartsWith(name, "C-");
+  return name.starts_with("C ") || name.starts_with("C-");
 }
 
 void CarrySaveFiles(const fs::path &eawDir, const fs::path &campaign, Caption &caption,

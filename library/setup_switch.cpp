@@ -84,7 +84,7 @@ size_t KeptPrefix(const std::vector<std::string> &loaded, const std::vector<std:
 void Click(LibraryState &state, int row, const std::string &doing, Caption &caption,
            Failures &failures) {
   caption.Set("Please wait- " + doing + " " + Quoted(state.Unigrid.Row(row).name));
-  ClickRow(state, row, caption, failures);
+  library::ClickRow(state, row, caption, failures);
 }
 
 } // namespace

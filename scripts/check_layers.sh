@@ -1,6 +1,7 @@
 #!/usr/bin/env bash
 # Fails when a folder includes a folder above it, or when the Qt-free core includes Qt.
-# Layers, lowest first: base; platform, slots, settings; library; app; ui.
+# Layers, lowest first: base; platform, slots, settings; library; app; ui, which reaches the library
+# only through app/.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 declare -A allowed=(
@@ -10,7 +11,7 @@ declare -A allowed=(
   [settings]="base settings"
   [library]="base slots library"
   [app]="base slots settings library app"
-  [ui]="base platform slots settings library app ui"
+  [ui]="base platform slots settings app ui"
 )
 core="base slots settings library app"
 bad=0

@@ -57,7 +57,7 @@ int WriteManifest(const fs::path &game, const fs::path &manifest) {
 // Where a player's file may rightly be: in its place, kept as an original, or, for a saved
 // game, carried home into a campaign folder.
 bool Found(const fs::path &game, const std::string &relative, const std::string &sum) {
-  const bool saved = StartsWith(relative, "Savedata/");
+  const bool saved = relative.starts_with("Savedata/");
   const std::string name = saved ? relative.substr(9) : relative;
   const fs::path keeping = KeepingFolder(game / "ZEP128");
   if (Checksum(game / relative) == sum ||
@@ -95,7 +95,7 @@ void LeftBehind(const fs::path &game, const Ledger &ledger, const std::set<std::
 int Check(const fs::path &game, const fs::path &manifest) {
   std::set<std::string> damage;
   for (const auto &entry : fs::recursive_directory_iterator(game))
-    if (EndsWith(NameText(entry.path()), ".partial"))
+    if (NameText(entry.path()).ends_with(".partial"))
       damage.insert("temporary file left: " + DisplayPath(entry.path()));
   std::ifstream in(manifest);
   std::set<std::string> players;

@@ -242,14 +242,9 @@ std::string CaptionOf(const std::string &folder) {
   return separated ? folder.substr(2) : folder;
 }
 
-bool EndsWith(const std::string &text, const std::string &tail) {
-  return text.size() >= tail.size() &&
-         text.compare(text.size() - tail.size(), tail.size(), tail) == 0;
-}
-
 // "mypic" has no extension; the game's pictures are read by their contents, so it holds JPEG bytes.
 const char *FormatOf(const std::string &pictureName) {
-  return EndsWith(pictureName, ".bmp") ? "BMP" : "JPG";
+  return pictureName.ends_with(".bmp") ? "BMP" : "JPG";
 }
 
 std::vector<std::string> MadeUpGameFile(const std::string &file, const std::string &owner) {

@@ -17,14 +17,14 @@ IniValues IniRead(const fs::path &eawDir, Failures &failures) {
     return values;
   for (const std::string &line : *lines)
     for (size_t k = 0; k < kIniKeys.size(); ++k)
-      if (StartsWith(line, kIniKeys[k]))
+      if (line.starts_with(kIniKeys[k]))
         values[k] = LooseNumberText(std::string_view(line).substr(kIniKeys[k].size()));
   return values;
 }
 
 static std::string RewrittenLine(const std::string &line, const IniTexts &texts) {
   for (size_t k = 0; k < kIniKeys.size(); ++k)
-    if (StartsWith(line, kIniKeys[k]))
+    if (line.starts_with(kIniKeys[k]))
       return std::string(kIniKeys[k]) + texts[k];
   return line;
 }
@@ -41,7 +41,7 @@ static int KeysFound(const std::vector<std::string> &lines) {
   int found = 0;
   for (const std::string_view key : kIniKeys)
     for (const std::string &line : lines)
-      if (StartsWith(line, key)) {
+      if (line.starts_with(key)) {
         ++found;
         break;
       }

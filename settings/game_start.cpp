@@ -15,8 +15,7 @@ bool IsWindowsProgram(const fs::path &program) {
 
 bool StartGame(const fs::path &eawDir, ProgramStarter &starter, Failures &failures) {
   const fs::path program = FindAnyCase(eawDir, "eaw.exe");
-  FileCheck(program);
-  if (!FileFound) {
+  if (!FileCheck(program)) {
     failures.Add(DisplayPath(program) + " was not found.");
     return false;
   }

@@ -40,8 +40,7 @@ static bool IsReadOnly(const fs::path &path) {
 
 bool IniEditorSave(const fs::path &eawDir, const std::string &text, Failures &failures) {
   const fs::path path = IniPath(eawDir);
-  FileCheck(path);
-  if (!FileFound)
+  if (!FileCheck(path))
     return false;
   if (IsReadOnly(path)) {
     failures.Add(path, "is read-only; it was not changed");

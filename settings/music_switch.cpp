@@ -4,8 +4,8 @@
 #include "base/file_ops.h"
 #include "base/links.h"
 #include "base/names.h"
-#include "base/plain_name.h"
 #include "base/new_file.h"
+#include "base/plain_name.h"
 #include "base/text_file.h"
 #include "settings/music_sets.h"
 
@@ -19,8 +19,7 @@ namespace fs = std::filesystem;
 // replace an empty folder there, and the game could not tell two such folders apart.
 static std::optional<std::string> RenameRefusal(const fs::path &from, const fs::path &to,
                                                 const fs::path &leaving = {}) {
-  FolderCheck(from);
-  if (!FolderFound)
+  if (!FolderCheck(from))
     return DisplayPath(from) + " is no folder";
   if (IsLink(from))
     return DisplayPath(from) + " " + kLinkReason;
@@ -118,10 +117,9 @@ void FinishMusicSwitch(const fs::path &eawDir, const fs::path &journal, Failures
     return;
   if (lines->size() == 3 && NamesTheSwitch(*lines, journal, failures)) {
     const fs::path music = Child(eawDir, (*lines)[0]);
-    FolderCheck(FindAnyCase(eawDir, "Music"));
-    if (!FolderFound) {
-      FolderCheck(Child(eawDir, (*lines)[2]));
-      const fs::path from = Child(eawDir, FolderFound ? (*lines)[2] : (*lines)[1]);
+    if (!FolderCheck(FindAnyCase(eawDir, "Music"))) {
+      const fs::path from =
+          Child(eawDir, FolderCheck(Child(eawDir, (*lines)[2])) ? (*lines)[2] : (*lines)[1]);
       if (IsLink(from))
         RefuseLink(from, "the music switch cut short was not finished", failures);
       else

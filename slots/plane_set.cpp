@@ -7,7 +7,7 @@
 
 namespace fs = std::filesystem;
 
-bool IsPlaneSetName(std::string_view name) { return StartsWith(name, "P-"); }
+bool IsPlaneSetName(std::string_view name) { return name.starts_with("P-"); }
 
 std::vector<fs::path> PlaneSetFolders(const fs::path &fmFolder) {
   std::vector<fs::path> found;

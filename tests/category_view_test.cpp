@@ -1,25 +1,12 @@
-#include "app/selector.h"
-#include "library/category_view.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
-TEST(CategoryView, HeaderTellsWhetherSeveralMayBeLoaded) {
-  FolderGrid grid;
-  const std::vector<std::string> codes = {"G", "N", "X", "Y", "Z", "K", "g", "S", "k"};
-  for (int k = 2; k < 11; ++k) {
-    ShowCategory(grid, codes, k);
-    EXPECT_EQ(grid.rows[0].name, k < 8 ? kMultipleSelectionText : kSingleSelectionText)
-        << codes[k - 2];
-  }
-  ShowCategory(grid, codes, 1);
-  EXPECT_EQ(grid.rows[0].name, kAllFoldersText);
-}
+using CategoryView = SelectorTest;
 
 // A letter is the line's last character, in UTF-8 or Windows-1252 text, and a folder belongs to
 // it when its name's first character is the same, read the same way.
-TEST(CategoryView, LettersBeyondAsciiListTheirFoldersAndNoLetterListsTheProgramsOwnFolder) {
-  GameFolder game;
+TEST_F(CategoryView, LettersBeyondAsciiListTheirFoldersAndNoLetterListsTheProgramsOwnFolder) {
   game.WithCategories("Eigene: \xC4\r\nMine: #\r\n\xD6sterreich: \xD6\r\n");
   for (const char *name : {"\xC3\x84-utf8", "\xC3\x96-other", "#-mine"})
     game.MakeFolder(std::string("ZEP128/") + name);
@@ -27,10 +14,6 @@ TEST(CategoryView, LettersBeyondAsciiListTheirFoldersAndNoLetterListsThePrograms
   game.MakeFolder("ZEP128/\xC4-latin"); // a name in Windows-1252 bytes
 #endif
   game.MakeFolder("ZEP128/#Selector");
-  RecordingCaption caption;
-  NotingStarter starter;
-  Selector selector(game.Path(), caption, starter);
-  Failures failures;
   selector.StartUp(failures);
   const auto shown = [&](int entry) {
     selector.ShowCategory(entry);

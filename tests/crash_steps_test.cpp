@@ -1,9 +1,8 @@
-#include "app/selector.h"
 #include "base/names.h"
 #include "base/step_seam.h"
 #include "library/keeping.h"
 #include "library/loaded_record.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
@@ -53,12 +52,9 @@ struct Operation {
 
 void PrintTo(const Operation &operation, std::ostream *out) { *out << operation.name; }
 
-void Click(Selector &selector, const std::string &folder, Failures &failures) {
-  selector.ClickRow(RowOf(selector.State().Unigrid, folder), failures);
-}
-
 std::function<void(Selector &, Failures &)> Clicks(const std::string &folder) {
-  return [folder](Selector &selector, Failures &failures) { Click(selector, folder, failures); };
+  return
+      [folder](Selector &selector, Failures &failures) { ClickFolder(selector, folder, failures); };
 }
 
 class CrashSteps : public ::testing::TestWithParam<Operation> {
@@ -93,7 +89,7 @@ protected:
       game->Write(path, bytes);
     Start();
     for (const std::string &folder : GetParam().before)
-      Click(*selector, folder, failures);
+      ClickFolder(*selector, folder, failures);
     bool killed = false;
     try {
       const StopAtStep stop(step);

@@ -28,6 +28,17 @@ TEST(EawIni, ReadsAndWritesLinesEndedByLineFeedsAlone) {
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\nHeight=\r\nSound=1\r\n");
 }
 
+TEST(EawIni, TheLastLineOfAKeyIsShownAndEveryLineOfItRewritten) {
+  GameFolder game;
+  game.Write("eaw.ini", kIni);
+  EXPECT_EQ(Read(game), (Shown{"1024", "600", std::nullopt, "0", "0", "16"}));
+  Failures failures;
+  inisave(game.Path(), true, kTexts, failures);
+  EXPECT_EQ(game.Read("eaw.ini"), "[Screen]\r\nWidth=1280\r\nHeight=\r\n Width=5\r\nwidth=6\r\n"
+                                  "[Game]\r\nDay=12\r\nWidth=1280\r\nMonth=abc\r\n"
+                                  "PlaneSetNumber=2\r\n");
+}
+
 TEST(EawIni, WritesAReadOnlyFileButNeverDamagesIt) {
   GameFolder game;
   Failures failures;

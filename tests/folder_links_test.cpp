@@ -1,4 +1,3 @@
-#include "app/selector.h"
 #include "base/links.h"
 #include "base/names.h"
 #include "tests/selector_fixture.h"

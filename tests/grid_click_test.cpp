@@ -1,5 +1,3 @@
-#include "app/selector.h"
-#include "library/grid_click.h"
 #include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
@@ -13,7 +11,6 @@ protected:
   const GridRow &Row(const std::string &name) const {
     return State().Unigrid.Row(RowOf(State().Unigrid, name));
   }
-  void Click(const std::string &name) { selector.ClickRow(RowOf(State().Unigrid, name), failures); }
 };
 
 } // namespace

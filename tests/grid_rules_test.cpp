@@ -8,45 +8,33 @@
 
 using Names = std::vector<std::string>;
 
-namespace {
+using GridRules = SelectorTest;
 
-class GridRules : public SelectorTest {
-protected:
-  void Click(const std::string &folder) {
-    selector.ClickRow(RowOf(selector.State().Unigrid, folder), failures);
-  }
-  std::string Mark(const std::string &folder) const {
-    const FolderGrid &grid = selector.State().Unigrid;
-    return grid.Row(RowOf(grid, folder)).mark;
-  }
-};
+// A category letter, and whether it allows several loaded folders at once.
+class LetterRule : public SelectorTest,
+                   public testing::WithParamInterface<std::pair<char, bool>> {};
 
-} // namespace
-
-TEST_F(GridRules, ASecondFolderOfALetterKeepsOrUnloadsTheFirst) {
-  // clang-format off
-  const std::pair<char, bool> letters[] = {
-      {'G', true}, {'N', true}, {'X', true}, {'Y', true}, {'Z', true}, {'K', true},
-      {'S', false}, {'F', false}, {'B', false}, {'T', false}, {'c', false}};
-  // clang-format on
-  std::string categories;
-  for (const auto &[letter, several] : letters) {
-    categories += std::string("Letter ") + letter + ": " + letter + "\r\n";
-    for (const char *which : {"one", "two"})
-      game.Write(std::string("ZEP128/") + letter + "-" + which + "/" + letter + which + ".dat");
-  }
-  game.WithCategories(categories);
+TEST_P(LetterRule, ASecondFolderOfTheLetterKeepsOrUnloadsTheFirst) {
+  const auto [letter, several] = GetParam();
+  const std::string code(1, letter);
+  game.WithCategories("Letter " + code + ": " + code + "\r\n");
+  game.Write("ZEP128/" + code + "-one/one.dat");
+  game.Write("ZEP128/" + code + "-two/two.dat");
   selector.StartUp(failures);
-  for (const auto &[letter, several] : letters) {
-    const std::string one = std::string(1, letter) + "-one", two = std::string(1, letter) + "-two";
-    Click(one);
-    Click(two);
-    EXPECT_EQ(Mark(one), several ? "S" : "") << letter;
-    EXPECT_EQ(game.Exists(std::string(1, letter) + "one.dat"), several) << letter;
-    EXPECT_EQ(Mark(two), "S") << letter;
-  }
+  Click(code + "-one");
+  Click(code + "-two");
+  EXPECT_EQ(Mark(code + "-one"), several ? "S" : "");
+  EXPECT_EQ(game.Exists("one.dat"), several);
+  EXPECT_EQ(Mark(code + "-two"), "S");
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
+
+// clang-format off
+INSTANTIATE_TEST_SUITE_P(Letters, LetterRule, testing::Values(
+    std::pair{'G', true}, std::pair{'N', true}, std::pair{'X', true}, std::pair{'Y', true},
+    std::pair{'Z', true}, std::pair{'K', true}, std::pair{'S', false}, std::pair{'F', false},
+    std::pair{'B', false}, std::pair{'T', false}, std::pair{'c', false}));
+// clang-format on
 
 TEST_F(GridRules, ACampaignUnloadedCarriesHomeItsSaveFilesOnly) {
   game.WithGameFolders().WithCategories("Campaigns: C\r\n");

@@ -1,8 +1,7 @@
-#include "app/selector.h"
 #include "base/names.h"
 #include "base/step_seam.h"
 #include "library/keeping.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
@@ -32,13 +31,8 @@ protected:
     selector = std::make_unique<Selector>(game.Path(), caption, starter);
     selector->StartUp(failures);
   }
-  std::string Click(const std::string &folder) {
-    return selector->ClickRow(RowOf(selector->State().Unigrid, folder), failures);
-  }
-  std::string Mark(const std::string &folder) const {
-    const FolderGrid &grid = selector->State().Unigrid;
-    return grid.Row(RowOf(grid, folder)).mark;
-  }
+  std::string Click(const std::string &folder) { return ClickFolder(*selector, folder, failures); }
+  std::string Mark(const std::string &folder) const { return MarkOf(*selector, folder); }
 
   static inline const std::string kOriginal = std::string("the game's own\0\xff bases", 23);
   GameFolder game;
@@ -159,7 +153,7 @@ TEST_F(Keeping, AFolderGoneFromTheLibraryOrPartlyLoadedIsSaidSo) {
   Failures partly;
   game.MakeFolder("sky.spt.partial/in the way");
   game.MakeFolder("sky.spt/in the way");
-  selector->ClickRow(RowOf(selector->State().Unigrid, "N-B"), partly);
+  ClickFolder(*selector, "N-B", partly);
   EXPECT_EQ(Mark("N-B"), "S");
   EXPECT_EQ(partly.Lines().size(), 1u);
   EXPECT_EQ(partly.HeadingOr("").find("\"N-B\" is only partly loaded"), 0u);
@@ -191,7 +185,7 @@ TEST_F(Keeping, ACopyThatCannotBeDeletedStaysListedIsTriedAgainAndIsNoOriginal) 
     fs::remove(game.Path() / "sky.spt");
     game.Write("sky.spt/held");
     Failures held;
-    selector->ClickRow(RowOf(selector->State().Unigrid, "N-C"), held);
+    ClickFolder(*selector, "N-C", held);
     EXPECT_NE(held.Message("").find("sky.spt"), std::string::npos);
     fs::remove_all(game.Path() / "sky.spt");
     game.Write("sky.spt", "N-C"); // released

@@ -83,12 +83,6 @@ TEST(LibraryModel, UnreadableLibraryFilesAreReportedNotFatal) {
   EXPECT_NE(failures.Message("").find("zep.ini"), std::string::npos);
 }
 
-TEST(LibraryModel, GridHeightStopsAtTwentyRows) {
-  EXPECT_EQ(GridHeightTwips(1), 240 + 72);
-  EXPECT_EQ(GridHeightTwips(19), 19 * 240 + 72);
-  EXPECT_EQ(GridHeightTwips(5000), 20 * 240 + 72);
-}
-
 TEST(LibraryModel, LibraryFilesAreFoundWhateverTheirCase) {
   GameFolder game;
   game.Write("zep128/ZEP.INI", "Skins: S\r\n");

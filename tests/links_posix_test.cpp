@@ -1,5 +1,4 @@
 #include "app/category_file.h"
-#include "app/selector.h"
 #include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>

@@ -42,12 +42,16 @@ TEST(MoveIn, PutsEachFileWhereTheGameLooksForIt) {
        {"A.MSN", "b.sve", "C.BGM", "readme.txt", "title.bmp", "mypic", "Contents.TXT",
         "eca_note.dat", "model.ldr", "pic.jpg", "skin.PCX", "anim.gif"})
     game.folder.Write(std::string("ZEP128/S-All/") + name, name);
+  SetReadOnly(game.folder.Path() / "ZEP128/S-All/readme.txt", true);
   game.Load("S-All");
 
   EXPECT_EQ(game.folder.Read("SAVEDATA/A.MSN"), "A.MSN");
   EXPECT_EQ(game.folder.Read("SAVEDATA/b.sve"), "b.sve");
   EXPECT_EQ(game.folder.Read("Music/C.BGM"), "C.BGM");
   EXPECT_EQ(game.folder.Read("readme.txt"), "readme.txt");
+  // A read-only file would stop its own unload: the copy and the folder's file become writable.
+  EXPECT_TRUE(IsWritable(game.folder.Path() / "readme.txt"));
+  EXPECT_TRUE(IsWritable(game.folder.Path() / "ZEP128/S-All/readme.txt"));
   // The game's own file of that name in another case is replaced, not doubled.
   EXPECT_EQ(game.folder.Read("TITLE.BMP"), "title.bmp");
   EXPECT_EQ(ListFiles(game.folder.Path(), "title.bmp"), std::vector<std::string>{"TITLE.BMP"});

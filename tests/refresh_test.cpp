@@ -1,7 +1,6 @@
 #include "app/category_file.h"
-#include "app/selector.h"
 #include "base/listing.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
@@ -9,16 +8,13 @@ namespace fs = std::filesystem;
 
 using Names = std::vector<std::string>;
 
-TEST(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
-  GameFolder game;
+using Refresh = SelectorTest;
+
+TEST_F(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   game.Write("planes.dat", "planes");
   for (const char *name : {"F-Spit", "S-Camo", "G-Sky", "unused"})
     game.Write(std::string("ZEP128/") + name + "/planes.dat", "addon");
-  RecordingCaption caption;
-  NotingStarter starter;
-  Selector selector(game.Path(), caption, starter);
   const SelectorState &state = selector.State();
-  Failures failures;
   // The category list is read at start-up only: a refresh keeps its letters.
   game.WithCategories("Skins: S\r\n");
   selector.StartUp(failures);
@@ -46,7 +42,7 @@ TEST(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   EXPECT_EQ(state.Unigrid.Row(0).name, "Only one selection can be made!");
   EXPECT_EQ(state.summary, "Refresh: 4 folders, 2 new, 1 gone");
   EXPECT_EQ(state.Codes, (Names{"S"}));
-  EXPECT_EQ(state.HoverRow, -1);
+  EXPECT_EQ(state.hoveredRow, -1);
   EXPECT_TRUE(state.Ready);
   EXPECT_EQ(ListFiles(game.Path()), (Names{"planes.dat"}));
   EXPECT_EQ(game.Read("planes.dat"), "planes");

@@ -1,7 +1,5 @@
-#include "app/selector.h"
 #include "base/new_file.h"
 #include "library/grid_click.h"
-#include "tests/game_folder.h"
 #include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
@@ -74,7 +72,7 @@ TEST(Reasons, AFullDiskAHeldFileAndNamesWindowsCannotKeepAreCalledSo) {
   state.Unigrid.rows.push_back(GridRow{"S-odd.", "", 0, kRowHeight});
   RecordingCaption caption;
   Failures failures;
-  ClickRow(state, 1, caption, failures);
+  library::ClickRow(state, 1, caption, failures);
   ASSERT_EQ(failures.Lines().size(), 1u);
   EXPECT_NE(failures.Lines()[0].find("cannot be loaded: it has " + dotted), std::string::npos);
 }

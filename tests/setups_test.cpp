@@ -1,4 +1,3 @@
-#include "app/selector.h"
 #include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
@@ -27,9 +26,6 @@ protected:
     game.Write("ZEP128/N-x/shared.dat", "x");
     game.Write("orig.dat", "the game's");
     selector.StartUp(failures);
-  }
-  std::string Click(const std::string &name) {
-    return selector.ClickRow(RowOf(selector.State().Unigrid, name), failures);
   }
   Names Loaded() { return selector.LoadedFolderNames(failures); }
   std::string Setup(const std::string &name) {

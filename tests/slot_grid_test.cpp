@@ -42,7 +42,7 @@ TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
   RecordingCaption caption;
   Failures failures;
 
-  ClickRow(state, 1, caption, failures); // F-Pack
+  library::ClickRow(state, 1, caption, failures); // F-Pack
   EXPECT_TRUE(state.Slots.frameVisible);
   EXPECT_TRUE(state.Slots.gridVisible);
   EXPECT_EQ(state.GridBackColor, 0xFFFFFFu);
@@ -55,11 +55,11 @@ TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
   EXPECT_EQ(state.Slots.rows[1].plnSlot, "3 ");
   EXPECT_EQ(state.Slots.rows[1].skinSlot, "P38H");
 
-  ClickRow(state, 2, caption, failures); // F-Plain replaces F-Pack
+  library::ClickRow(state, 2, caption, failures); // F-Plain replaces F-Pack
   EXPECT_FALSE(state.Slots.frameVisible);
   EXPECT_EQ(state.Unigrid.rows[1].mark, "");
 
-  ClickRow(state, 2, caption, failures); // unload F-Plain
+  library::ClickRow(state, 2, caption, failures); // unload F-Plain
   EXPECT_TRUE(state.Slots.rows.empty());
   EXPECT_FALSE(state.Slots.frameVisible);
   EXPECT_TRUE(failures.Empty());

@@ -54,16 +54,11 @@ TEST(Copy, OnlyANewNameIsWrittenWithoutTheTemporaryFile) {
 TEST(Existence, FilesAndFoldersAreToldApart) {
   TestFolder folder;
   const fs::path file = folder.Write("eaw.ini");
-  FolderCheck(file);
-  EXPECT_FALSE(FolderFound);
-  FileCheck(folder.Path());
-  EXPECT_FALSE(FileFound);
-  FileCheck(file);
-  EXPECT_TRUE(FileFound);
-  FileCheck(folder.Path() / "missing");
-  EXPECT_FALSE(FileFound);
-  FolderCheck(folder.Path());
-  EXPECT_TRUE(FolderFound);
+  EXPECT_FALSE(FolderCheck(file));
+  EXPECT_FALSE(FileCheck(folder.Path()));
+  EXPECT_TRUE(FileCheck(file));
+  EXPECT_FALSE(FileCheck(folder.Path() / "missing"));
+  EXPECT_TRUE(FolderCheck(folder.Path()));
 }
 
 TEST(Listing, PatternsMatchLikeWindowsIgnoringCase) {

@@ -1,11 +1,10 @@
-#include "app/selector.h"
 #include "base/listing.h"
 #include "base/names.h"
 #include "base/text_encoding.h"
 #include "library/ledger_check.h"
 #include "library/move_out.h"
 #include "library/reset_all.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
@@ -58,9 +57,10 @@ TEST(NameCase, UnloadFindsACopyWhoseNameDiffersBeyondAscii) {
   EXPECT_TRUE(failures.Empty());
 }
 
+using Windows1252Files = SelectorTest;
+
 // Notepad and older tools write Windows-1252: such files still name the folders and files.
-TEST(TextEncoding, LibraryFilesWrittenInWindows1252AreUnderstood) {
-  GameFolder game;
+TEST_F(Windows1252Files, NameTheFoldersAndFilesTheyMean) {
   game.WithCategories("Skins f\xFCr alle: S\r\n");
   game.Addon("S-J\xC3\xA4ger");
   game.WithRecord("S-J\xE4ger\r\n\r\n");
@@ -69,10 +69,6 @@ TEST(TextEncoding, LibraryFilesWrittenInWindows1252AreUnderstood) {
   game.MakeFolder("Kl\xC3\xA4nge");
   game.Write("ZEP128/CleanUp.ini", "*.d\xE4t\r\n");
   game.Write("alt.d\xC3\xA4t");
-  RecordingCaption caption;
-  NotingStarter starter;
-  Selector selector(game.Path(), caption, starter);
-  Failures failures;
   selector.StartUp(failures);
   const SelectorState &state = selector.State();
   EXPECT_EQ(state.List3.back(), "Skins f\xC3\xBCr alle");

@@ -1,9 +1,11 @@
 #include "tests/window_driver.h"
 
+#include "ui/failure_box.h"
+
 #include <QApplication>
+#include <QLabel>
 #include <QMessageBox>
 #include <QTest>
-#include <QTimer>
 
 WindowDriver::WindowDriver(const std::filesystem::path &eawDir)
     : window_(std::make_unique<MainWindow>(eawDir)),
@@ -24,15 +26,16 @@ void WindowDriver::ClickRow(int row, int column) {
 
 void WindowDriver::PressGridKey(int key) { QTest::keyClick(Grid(), static_cast<Qt::Key>(key)); }
 
+QString WindowDriver::Mark(int row) { return Grid()->model()->index(row - 1, 2).data().toString(); }
+
+QString WindowDriver::Summary() { return Find<QLabel>("Label22")->text(); }
+
 QString WindowDriver::AnswerNextBox(QMessageBox::StandardButton button,
                                     const std::function<void()> &action) {
   QString text;
-  QTimer::singleShot(0, [&] {
-    auto *box = qobject_cast<QMessageBox *>(QApplication::activeModalWidget());
-    if (!box)
-      return;
-    text = box->text();
-    box->button(button)->click();
+  SetNextAnswer([&](const QMessageBox &box) {
+    text = box.text();
+    return button == QMessageBox::NoButton ? box.standardButton(box.defaultButton()) : button;
   });
   action();
   return text;

@@ -23,7 +23,12 @@ public:
   void ClickRow(int row, int column = 1);
   // Types a key into the folder grid.
   void PressGridKey(int key);
-  // Does `action`, which opens a modal box, answers the box with `button` and returns its text.
+  // The mark column of folder row `row` (1 is the first folder): "S" when loaded.
+  QString Mark(int row);
+  // The line that sums up the last action.
+  QString Summary();
+  // Does `action`, which asks a question, answers it with `button` (NoButton: the box's default
+  // button, as Enter would) and returns the question's text.
   QString AnswerNextBox(QMessageBox::StandardButton button, const std::function<void()> &action);
   // The texts of the message boxes the window has shown since the last call; closes them.
   QStringList TakeMessages();

@@ -4,6 +4,7 @@
 #include "ui/window_layout.h"
 
 #include <QMessageBox>
+#include <utility>
 
 namespace {
 
@@ -38,7 +39,20 @@ QMessageBox *ListBox(QWidget *parent, QMessageBox::Icon icon, const std::string 
   return new QMessageBox(icon, WindowCaptionText().simplified(), text, buttons, parent);
 }
 
+std::function<QMessageBox::StandardButton(const QMessageBox &)> nextAnswer;
+
+// The button the player chose in the question `box`, or the one a test set beforehand.
+int Answer(QMessageBox &box) {
+  if (!nextAnswer)
+    return box.exec();
+  return std::exchange(nextAnswer, nullptr)(box);
+}
+
 } // namespace
+
+void SetNextAnswer(std::function<QMessageBox::StandardButton(const QMessageBox &)> answer) {
+  nextAnswer = std::move(answer);
+}
 
 void ShowFailures(QWidget *parent, const Failures &failures, const QString &heading) {
   if (failures.Empty())
@@ -86,7 +100,7 @@ bool ConfirmDeletion(QWidget *parent, int loadedFiles, const std::vector<std::st
       ListBox(parent, QMessageBox::Question, heading, names, QMessageBox::Ok | QMessageBox::Cancel);
   box->setObjectName("ConfirmResetAll");
   box->setDefaultButton(QMessageBox::Cancel);
-  const bool agreed = box->exec() == QMessageBox::Ok;
+  const bool agreed = Answer(*box) == QMessageBox::Ok;
   delete box;
   return agreed;
 }
@@ -95,5 +109,5 @@ bool Confirm(QWidget *parent, const QString &question) {
   QMessageBox box(QMessageBox::Question, WindowCaptionText().simplified(), question,
                   QMessageBox::Ok | QMessageBox::Cancel, parent);
   box.setDefaultButton(QMessageBox::Cancel);
-  return box.exec() == QMessageBox::Ok;
+  return Answer(box) == QMessageBox::Ok;
 }

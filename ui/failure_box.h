@@ -2,8 +2,10 @@
 
 #include "base/failures.h"
 
+#include <QMessageBox>
 #include <QString>
 #include <QWidget>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -19,3 +21,6 @@ void ShowNotice(QWidget *parent, const std::string &notice);
 bool ConfirmDeletion(QWidget *parent, int loadedFiles, const std::vector<std::string> &names);
 // Asks `question` in a box over `parent` with OK and Cancel, Cancel the default. True for OK.
 bool Confirm(QWidget *parent, const QString &question);
+// For tests: the next question (Confirm, ConfirmDeletion) is not shown; `answer` is given its box
+// and returns the button chosen.
+void SetNextAnswer(std::function<QMessageBox::StandardButton(const QMessageBox &)> answer);

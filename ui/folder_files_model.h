@@ -1,6 +1,6 @@
 #pragma once
 
-#include "library/folder_files.h"
+#include "app/selector.h"
 
 #include <QAbstractTableModel>
 #include <vector>

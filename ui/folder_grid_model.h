@@ -1,6 +1,6 @@
 #pragma once
 
-#include "library/folder_grid.h"
+#include "app/selector_state.h"
 
 #include <QAbstractTableModel>
 

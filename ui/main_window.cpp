@@ -1,6 +1,5 @@
 #include "ui/main_window.h"
 
-#include "library/grid_click.h"
 #include "platform/qt_paths.h"
 #include "ui/event_hook.h"
 #include "ui/failure_box.h"
