@@ -141,8 +141,7 @@ TEST(FeedbackWindow, AStartThatFinishedAnInterruptedUnloadShowsTheInstructions) 
 
 TEST(FeedbackWindow, AGameThatEndsAtOnceWithAnErrorIsToldOnce) {
   GameFolder game;
-  const fs::path exe = game.Write("eaw.exe", "#!/bin/sh\nexit 3\n");
-  fs::permissions(exe, fs::perms::owner_exec, fs::perm_options::add);
+  MakeStandInGame(game, 3);
   WindowDriver driver(game.Path());
   QTest::mouseClick(driver.Find<QPushButton>("delmsn"), Qt::LeftButton);
   EXPECT_EQ(driver.Summary(), "Game started");

@@ -1,4 +1,3 @@
-#include "platform/qt_paths.h"
 #include "tests/game_folder.h"
 #include "tests/window_driver.h"
 
@@ -23,18 +22,6 @@ int StartedCount(const fs::path &folder) {
   for (const auto &entry : fs::directory_iterator(folder))
     count += entry.path().filename().string().rfind("started-", 0) == 0;
   return count;
-}
-
-// An eaw.exe that leaves a "started-<process id>" file beside itself: a shell script, which only
-// POSIX systems run, or on Windows a small program built with the tests.
-void MakeStandInGame(GameFolder &game) {
-#ifdef _WIN32
-  fs::copy_file(ToPath(QCoreApplication::applicationDirPath()) / "stand_in_game.exe",
-                game.Path() / "eaw.exe");
-#else
-  const fs::path exe = game.Write("eaw.exe", "#!/bin/sh\ntouch \"$(dirname \"$0\")/started-$$\"\n");
-  fs::permissions(exe, fs::perms::owner_exec, fs::perm_options::add);
-#endif
 }
 
 } // namespace

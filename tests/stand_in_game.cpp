@@ -1,5 +1,6 @@
 // The game for the window tests on Windows, copied into a game folder as eaw.exe: leaves a file
-// "started-<process id>" beside itself, as the shell script that stands in for it elsewhere does.
+// "started-<process id>" beside itself, as the shell script that stands in for it elsewhere does,
+// and ends with the status written in a file "exit-status" beside it, 0 without one.
 #include <windows.h>
 
 #include <filesystem>
@@ -9,7 +10,10 @@
 int main() {
   std::wstring self(MAX_PATH, L'\0');
   self.resize(GetModuleFileNameW(nullptr, self.data(), static_cast<DWORD>(self.size())));
-  const std::filesystem::path mark = std::filesystem::path(self).parent_path() /
-                                     ("started-" + std::to_string(GetCurrentProcessId()));
-  return std::ofstream(mark) ? 0 : 1;
+  const std::filesystem::path folder = std::filesystem::path(self).parent_path();
+  if (!std::ofstream(folder / ("started-" + std::to_string(GetCurrentProcessId()))))
+    return 1;
+  int status = 0;
+  std::ifstream(folder / "exit-status") >> status;
+  return status;
 }

@@ -1,5 +1,7 @@
 #include "tests/window_driver.h"
 
+#include "platform/qt_paths.h"
+#include "tests/game_folder.h"
 #include "ui/failure_box.h"
 
 #include <QApplication>
@@ -52,4 +54,18 @@ QStringList WindowDriver::TakeMessages() {
   }
   QApplication::processEvents();
   return texts;
+}
+
+void MakeStandInGame(GameFolder &game, int status) {
+  namespace fs = std::filesystem;
+#ifdef _WIN32
+  fs::copy_file(ToPath(QCoreApplication::applicationDirPath()) / "stand_in_game.exe",
+                game.Path() / "eaw.exe");
+  game.Write("exit-status", std::to_string(status));
+#else
+  const fs::path exe =
+      game.Write("eaw.exe", "#!/bin/sh\ntouch \"$(dirname \"$0\")/started-$$\"\nexit " +
+                                std::to_string(status) + "\n");
+  fs::permissions(exe, fs::perms::owner_exec, fs::perm_options::add);
+#endif
 }

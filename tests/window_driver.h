@@ -9,6 +9,13 @@
 #include <functional>
 #include <memory>
 
+class GameFolder;
+
+// Puts an eaw.exe into `game` that leaves a "started-<process id>" file beside itself and ends
+// with `status`: a shell script, which only POSIX systems run, or on Windows a small program built
+// with the tests.
+void MakeStandInGame(GameFolder &game, int status = 0);
+
 // A started main window for a game folder, and the few ways a person works it.
 class WindowDriver {
 public:
