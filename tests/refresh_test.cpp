@@ -53,20 +53,3 @@ TEST(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   EXPECT_EQ(game.Record(), "S-Camo\r\nG-Sky\r\n\r\n");
   EXPECT_TRUE(failures.Empty());
 }
-
-// A record written in Windows-1252 names the folder that UTF-8 names differently; a name in
-// neither reading loads nothing.
-TEST(Refresh, AStartUpLoadsTheRecordedFoldersWhicheverEncodingTheRecordUses) {
-  GameFolder game;
-  for (const char *name : {"S-Caf\xC3\xA9", "S-Camo", "G-Sky", "G-Sea"})
-    game.MakeFolder(std::string("ZEP128/") + name);
-  game.WithCategories("Skins: S\r\nGround: G\r\n");
-  game.WithRecord("S-Caf\xE9\r\nG-Sky\r\nG-Gone\r\n\r\n");
-  RecordingCaption caption;
-  NotingStarter starter;
-  Selector selector(game.Path(), caption, starter);
-  Failures failures;
-  selector.StartUp(failures);
-  EXPECT_EQ(RowNames(selector.State().Unigrid, true),
-            (Names{"S-Caf\xC3\xA9 [S]", "S-Camo", "G-Sea", "G-Sky [S]"}));
-}
