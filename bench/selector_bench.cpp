@@ -1,9 +1,9 @@
 // Measures the program's file work and start-up as ratios against plain baselines in paired
 // rounds, on tmpfs when the machine has one and on the temporary folder's own file system.
-// Usage: selector_bench [pairs [setups | clone <folder>]]   (at least 9; 9 when not given;
-// "setups" runs only the setup lines, "clone" only the load of big files in <folder>, which
-// scripts/bench_reflink.sh mounts). It starts itself with "--show-window <game folder>" for each
-// timed start-up.
+// Usage: selector_bench [pairs [setups | startup | clone <folder>]]   (at least 9; 9 when not
+// given; "setups" or "startup" runs only those lines, "clone" only the load of big files in
+// <folder>, which scripts/bench_reflink.sh mounts). It starts itself with
+// "--show-window <game folder>" for each timed start-up.
 
 #include "bench/file_work.h"
 #include "bench/paired_rounds.h"
@@ -91,11 +91,12 @@ int main(int argc, char **argv) {
     fs::create_directories(root);
     PrintHeading("== " + base.string() + " (" + MountOf(base) + "), " + std::to_string(pairs) +
                  " pairs ==");
-    const bool setupsOnly = argc > 2 && std::string(argv[2]) == "setups";
-    if (!setupsOnly)
+    const std::string only = argc > 2 ? argv[2] : "";
+    if (only.empty())
       BenchFileWork(root, pairs);
-    BenchSetups(root, pairs);
-    if (!setupsOnly)
+    if (only.empty() || only == "setups")
+      BenchSetups(root, pairs);
+    if (only.empty() || only == "startup")
       BenchStartUp(root, pairs);
     fs::remove_all(root);
   }
