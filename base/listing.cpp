@@ -3,6 +3,7 @@
 #include "base/names.h"
 
 #include <algorithm>
+#include <numeric>
 #include <system_error>
 
 #ifdef _WIN32
@@ -160,9 +161,31 @@ std::error_code ForEachEntry(const fs::path &folder,
 }
 #endif
 
+// Sorts as NameLess does, with each name's upper-case form made once, in one buffer, so that the
+// comparisons of a large folder compare bytes rather than fold them anew each time.
 void SortNames(std::vector<std::string> &names) {
-  std::sort(names.begin(), names.end(),
-            [](const std::string &a, const std::string &b) { return NameLess(a, b); });
+  std::string keys;
+  std::vector<size_t> starts;
+  starts.reserve(names.size() + 1);
+  for (const std::string &name : names) {
+    starts.push_back(keys.size());
+    keys += Upper(name);
+  }
+  starts.push_back(keys.size());
+  const auto key = [&](size_t i) {
+    return std::string_view(keys).substr(starts[i], starts[i + 1] - starts[i]);
+  };
+  std::vector<size_t> order(names.size());
+  std::iota(order.begin(), order.end(), size_t{0});
+  std::sort(order.begin(), order.end(), [&](size_t a, size_t b) {
+    const int keyOrder = key(a).compare(key(b));
+    return keyOrder != 0 ? keyOrder < 0 : names[a] < names[b];
+  });
+  std::vector<std::string> sorted;
+  sorted.reserve(names.size());
+  for (const size_t i : order)
+    sorted.push_back(std::move(names[i]));
+  names.swap(sorted);
 }
 
 } // namespace

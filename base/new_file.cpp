@@ -118,29 +118,71 @@ std::error_code WriteNewFile(const fs::path &path, const std::string &bytes) {
   return error;
 }
 
-// Copies what is left of `in` (`size` bytes by its size) into `out`, chunk by chunk, telling
-// `progress` after each chunk but the last; the kernel moves the bytes where it can.
-static bool CopyContent(int in, int out, off_t size, const CopyProgress &progress) {
-  std::uint64_t copied = 0;
-  const auto report = [&] {
-    if (progress && copied < static_cast<std::uint64_t>(size))
-      progress(copied);
-  };
-  while (copied < static_cast<std::uint64_t>(size)) {
-    const std::uint64_t left = static_cast<std::uint64_t>(size) - copied;
-    const ssize_t sent =
-        ::sendfile(out, in, nullptr, static_cast<size_t>(std::min(left, kChunkBytes)));
+static thread_local CopyWay lastWay = CopyWay::InKernel;
+
+CopyWay LastCopyWay() { return lastWay; }
+
+// Moves up to `size` bytes from `in` to `out`, both at their file positions, as the kernel can;
+// returns what it moved, or -1 with errno.
+using Mover = ssize_t (*)(int in, int out, size_t size);
+
+// Within one file system that shares blocks (XFS with reflink, Btrfs) this clones them: no time,
+// no space, and a later write to either file leaves the other as it was.
+static ssize_t CopyRange(int in, int out, size_t size) {
+  return ::copy_file_range(in, nullptr, out, nullptr, size, 0);
+}
+
+static ssize_t SendFile(int in, int out, size_t size) { return ::sendfile(out, in, nullptr, size); }
+
+// Whether the kernel turns the way down as such (across file systems, on a file system or kernel
+// that lacks it), so that another way may still copy the file.
+static bool Refused(int error) {
+  return error == EXDEV || error == EINVAL || error == ENOSYS || error == EOPNOTSUPP ||
+         error == EPERM;
+}
+
+enum class Moved { all, refused, failed };
+
+// Moves what is left of `size` bytes chunk by chunk with `move`, counting them in `copied` and
+// calling `report` after each chunk; a source that ends early ends the copy there.
+template <typename Report>
+static Moved MoveChunks(Mover move, int in, int out, std::uint64_t size, std::uint64_t &copied,
+                        const Report &report) {
+  while (copied < size) {
+    const ssize_t sent = move(in, out, static_cast<size_t>(std::min(size - copied, kChunkBytes)));
     if (sent < 0 && errno == EINTR)
       continue;
-    if (sent < 0 && (errno == EINVAL || errno == ENOSYS))
-      break;
+    if (sent < 0 && Refused(errno))
+      return Moved::refused;
     if (sent <= 0)
-      return sent == 0;
+      return sent == 0 ? Moved::all : Moved::failed;
     copied += static_cast<std::uint64_t>(sent);
     report();
   }
-  if (size > 0 && copied == static_cast<std::uint64_t>(size))
+  return Moved::all;
+}
+
+// Copies what is left of `in` (`size` bytes by its size) into `out`, chunk by chunk, telling
+// `progress` after each chunk but the last: copy_file_range first, then sendfile, then reads and
+// writes for what neither would move (a size of 0 may hide content, as in /proc).
+static bool CopyContent(int in, int out, off_t size, const CopyProgress &progress) {
+  const auto total = static_cast<std::uint64_t>(size);
+  std::uint64_t copied = 0;
+  const auto report = [&] {
+    if (progress && copied < total)
+      progress(copied);
+  };
+  lastWay = CopyWay::InKernel;
+  Moved moved = MoveChunks(CopyRange, in, out, total, copied, report);
+  if (moved == Moved::refused) {
+    lastWay = CopyWay::Fallback;
+    moved = MoveChunks(SendFile, in, out, total, copied, report);
+  }
+  if (moved == Moved::failed)
+    return false;
+  if (total > 0 && copied == total)
     return true;
+  lastWay = CopyWay::Fallback;
   char buffer[1 << 16];
   std::uint64_t reported = copied;
   for (;;) {

@@ -19,6 +19,14 @@ using CopyProgress = std::function<void(std::uint64_t copied)>;
 // deleted again, so that nothing half-written stays.
 std::error_code CopyToNewFile(const std::filesystem::path &source,
                               const std::filesystem::path &path, const CopyProgress &progress = {});
+#ifndef _WIN32
+// How CopyToNewFile moved the bytes of its last copy on this thread: by copy_file_range, which
+// clones blocks where the file system can, or by sendfile or reads and writes where that was
+// refused (across file systems, on old kernels). Windows copies with CopyFileExW, which lets the
+// system clone blocks on ReFS and Dev Drive volumes.
+enum class CopyWay { InKernel, Fallback };
+CopyWay LastCopyWay();
+#endif
 // Whether `error` says that an entry of that name is already there.
 bool AlreadyExists(const std::error_code &error);
 // The reason of `error` for a message: "the disk is full" when it is, on Windows "in use by

@@ -5,6 +5,14 @@
 #include "bench/quiet_selector.h"
 #include "library/folder_grid.h"
 #include "library/reset_all.h"
+#include "ui/main_window.h"
+
+#include <QApplication>
+#include <QTableView>
+#include <algorithm>
+#include <clocale>
+#include <locale.h>
+#include <set>
 
 #include <cstdio>
 #include <cstdlib>
@@ -31,14 +39,19 @@ void StopOnFailures(const Failures &failures) {
 }
 
 // A game folder of `gameFiles` files in all once its add-on folder of 2,000 small files is
-// loaded, and the Selector that loads and unloads that folder by a click on its row.
+// loaded, and the Selector that loads and unloads that folder by a click on its row. With
+// `originals`, the game has its own file of each name the folder brings.
 class LoadBench {
 public:
-  LoadBench(const fs::path &root, int gameFiles)
-      : game_(MakeGame(root, "game" + std::to_string(gameFiles), "Skins: S\r\n",
+  LoadBench(const fs::path &root, int gameFiles, const std::string &variant = "",
+            bool originals = false)
+      : game_(MakeGame(root, "game" + std::to_string(gameFiles) + variant, "Skins: S\r\n",
                        gameFiles - kAddonFiles)),
         copies_(MakeAddon(game_, "S-Bench", kAddonFiles)),
         quiet_(std::make_unique<QuietSelector>(game_.game)) {
+    if (originals)
+      for (const auto &copy : copies_)
+        WriteBytes(copy.second, 1024);
     Failures failures;
     quiet_->selector.StartUp(failures);
     StopOnFailures(failures);
@@ -66,6 +79,7 @@ public:
       fs::remove(copy.second, error);
   }
   const Copies &CopiesMade() const { return copies_; }
+  const fs::path &Game() const { return game_.game; }
 
 private:
   BenchGame game_;
@@ -86,6 +100,30 @@ void CopiesThroughTemporaryNames(const Copies &copies) {
     temporary += ".partial";
     fs::copy_file(source, temporary, error);
     fs::rename(temporary, target, error);
+  }
+}
+
+// Where the baseline puts the game's originals aside.
+fs::path AsideOf(const fs::path &target) {
+  return target.parent_path() / "aside" / target.filename();
+}
+
+// The least work that keeps the game's files: each renamed aside, then the copy.
+void CopiesKeepingOriginals(const Copies &copies) {
+  std::error_code error;
+  for (const auto &[source, target] : copies) {
+    fs::rename(target, AsideOf(target), error);
+    fs::copy_file(source, target, error);
+  }
+}
+
+// The game's originals back in place, whichever side put them aside.
+void RestoreOriginals(LoadBench &bench) {
+  bench.Unload();
+  std::error_code error;
+  for (const auto &copy : bench.CopiesMade()) {
+    fs::create_directory(AsideOf(copy.second).parent_path(), error);
+    fs::rename(AsideOf(copy.second), copy.second, error);
   }
 }
 
@@ -110,6 +148,43 @@ void BenchLoads(const fs::path &root, int pairs) {
                 RunPairs(pairs, ours, {[&] { bench.Clear(); }, [&] { PlainCopies(copies); }}),
                 1.25);
   }
+}
+
+void BenchLoadKeepingOriginals(const fs::path &root, int pairs) {
+  LoadBench bench(root, kAddonFiles, "-originals", true);
+  const Copies &copies = bench.CopiesMade();
+  RestoreOriginals(bench);
+  PrintResult("load 2,000 small files over as many game files / rename aside+copy",
+              RunPairs(pairs, {[&] { RestoreOriginals(bench); }, [&] { bench.Click(); }},
+                       {[&] { RestoreOriginals(bench); }, [&] { CopiesKeepingOriginals(copies); }}),
+              1.1);
+}
+
+// The same load clicked in the real window (offscreen), which shows its progress, against the
+// Selector whose caption only stores its text.
+void BenchLoadInWindow(const fs::path &root, int pairs) {
+  LoadBench bench(root, kAddonFiles, "-quiet");
+  const LoadBench shown(root, kAddonFiles, "-window");
+  MainWindow window(shown.Game());
+  window.FormLoad();
+  window.show();
+  QApplication::processEvents();
+  QTableView *grid = window.findChild<QTableView *>("Unigrid");
+  const auto clickInWindow = [&] {
+    emit grid->clicked(grid->model()->index(0, 0));
+    QApplication::processEvents();
+  };
+  const fs::path firstCopy = shown.CopiesMade().front().second;
+  const auto unloadInWindow = [&] {
+    if (fs::exists(firstCopy))
+      clickInWindow();
+  };
+  bench.Clear();
+  PrintResult("load 2,000 small files in the window / Selector, silent caption",
+              RunPairs(pairs, {unloadInWindow, clickInWindow},
+                       {[&] { bench.Clear(); }, [&] { bench.Click(); }}),
+              1.1);
+  unloadInWindow();
 }
 
 void BenchUnloads(const fs::path &root, int pairs) {
@@ -159,6 +234,57 @@ void MatchAndUnlink(const fs::path &folder, const std::vector<std::string> &patt
   ::closedir(dir);
 }
 
+std::string FoldAscii(std::string text) {
+  for (char &c : text)
+    c = static_cast<char>(c >= 'A' && c <= 'Z' ? c - 'A' + 'a' : c);
+  return text;
+}
+
+// One directory read that folds each name once and matches it against the patterns, folded once
+// beforehand, in the C locale, where fnmatch compares bytes.
+void FoldOnceAndUnlink(const fs::path &folder, const std::vector<std::string> &foldedPatterns) {
+  const locale_t bytes = ::newlocale(LC_ALL_MASK, "C", nullptr);
+  const locale_t before = ::uselocale(bytes);
+  DIR *dir = ::opendir(folder.c_str());
+  const int descriptor = dir ? ::dirfd(dir) : -1;
+  while (const dirent *entry = dir ? ::readdir(dir) : nullptr) {
+    if (entry->d_type != DT_REG)
+      continue;
+    const std::string name = FoldAscii(entry->d_name);
+    for (const std::string &pattern : foldedPatterns)
+      if (::fnmatch(pattern.c_str(), name.c_str(), 0) == 0) {
+        ::unlinkat(descriptor, entry->d_name, 0);
+        break;
+      }
+  }
+  if (dir)
+    ::closedir(dir);
+  ::uselocale(before);
+  ::freelocale(bytes);
+}
+
+std::set<std::string> NamesIn(const fs::path &folder) {
+  std::set<std::string> names;
+  std::error_code error;
+  for (const auto &entry : fs::directory_iterator(folder, error))
+    names.insert(entry.path().filename().string());
+  return names;
+}
+
+// Stops the benchmark unless both sides, run once each, leave the same files in `folder`.
+void CheckSameFilesLeft(const fs::path &folder, const Side &ours, const Side &baseline) {
+  ours.prepare();
+  ours.run();
+  const std::set<std::string> oursLeft = NamesIn(folder);
+  baseline.prepare();
+  baseline.run();
+  if (oursLeft != NamesIn(folder)) {
+    std::fprintf(stderr, "Reset All and its baseline leave different files in %s\n",
+                 folder.string().c_str());
+    std::exit(1);
+  }
+}
+
 void BenchResetAll(const fs::path &root, int pairs) {
   constexpr int kGameFiles = 20000, kMatching = 2000;
   const BenchGame game = MakeGame(root, "reset", "Skins: S\r\n", kGameFiles - kMatching);
@@ -176,9 +302,18 @@ void BenchResetAll(const fs::path &root, int pairs) {
                     quiet.selector.ResetAll(quiet.selector.ResetAllFiles(failures), failures);
                   }};
   const std::vector<std::string> patterns = SplitPatterns(kDefaultCleanUpPatterns);
+  std::vector<std::string> folded;
+  for (const std::string &pattern : patterns)
+    folded.push_back(FoldAscii(pattern));
   const Side plain{addAddonFiles, [&] { MatchAndUnlink(game.game, patterns); }};
+  const Side foldOnce{addAddonFiles, [&] { FoldOnceAndUnlink(game.game, folded); }};
+  CheckSameFilesLeft(game.game, ours, plain);
+  CheckSameFilesLeft(game.game, ours, foldOnce);
   const std::string work = "Reset All, 2,000 of 20,000 files match";
-  PrintResult(work + " / read+fnmatch+unlink", RunPairs(pairs, ours, plain), 1.2);
+  PrintResult(work + " / read+fold once+fnmatch (C locale)+unlink", RunPairs(pairs, ours, foldOnce),
+              1.2);
+  PrintResult(work + " / read+fnmatch casefold (" + std::setlocale(LC_CTYPE, nullptr) + ")+unlink",
+              RunPairs(pairs, ours, plain), 0);
   PrintResult(work + " / removal loop",
               RunPairs(pairs, ours, {addAddonFiles, [&] { PlainRemovals(addonFiles); }}), 0);
   StopOnFailures(failures);
@@ -186,8 +321,36 @@ void BenchResetAll(const fs::path &root, int pairs) {
 
 } // namespace
 
+void BenchCloneLoad(const fs::path &root, int pairs) {
+  constexpr int kBigFiles = 20;
+  const BenchGame game = MakeGame(root, "clone", "Skins: S\r\n", 0);
+  Copies copies;
+  fs::create_directories(game.library / "S-Big");
+  for (int i = 0; i < kBigFiles; ++i) {
+    const std::string name = Numbered("big", i, ".dat");
+    WriteBytes(game.library / "S-Big" / name, 50 << 20);
+    copies.emplace_back(game.library / "S-Big" / name, game.game / name);
+  }
+  QuietSelector quiet(game.game);
+  Failures failures;
+  quiet.selector.StartUp(failures);
+  const auto clear = [&] {
+    if (IsLoaded(quiet.selector.State().Unigrid.Row(1)))
+      quiet.selector.ClickRow(1, failures);
+    PlainRemovals(copies);
+  };
+  PrintResult("load 20 x 50 MB, reflink file system / copy loop",
+              RunPairs(pairs, {clear, [&] { quiet.selector.ClickRow(1, failures); }},
+                       {clear, [&] { PlainCopies(copies); }}),
+              0.05);
+  clear();
+  StopOnFailures(failures);
+}
+
 void BenchFileWork(const fs::path &root, int pairs) {
+  BenchLoadInWindow(root, pairs);
   BenchLoads(root, pairs);
+  BenchLoadKeepingOriginals(root, pairs);
   BenchUnloads(root, pairs);
   BenchResetAll(root, pairs);
 }

@@ -7,6 +7,7 @@
 #include <QApplication>
 #include <algorithm>
 #include <cstdio>
+#include <cstdlib>
 #include <fcntl.h>
 #include <fstream>
 #include <memory>
@@ -52,26 +53,47 @@ std::unique_ptr<MainWindow> ShowWindow(const fs::path &game) {
   return window;
 }
 
-// Starts this program as the child that shows the window on `game`; returns its peak memory
-// in MiB once it has ended.
+// Starts this program as the child that shows the window on `game`; returns the child's peak
+// memory in MiB, as it tells it once the window is shown. (The peak that wait4 reports would also
+// hold this process's size, which the child shares until it runs the program anew.)
 double RunChild(const BenchGame &game) {
   const std::string self = fs::read_symlink("/proc/self/exe").string();
   const std::string folder = game.game.string();
   char *args[] = {const_cast<char *>(self.c_str()), const_cast<char *>("--show-window"),
                   const_cast<char *>(folder.c_str()), nullptr};
+  int told[2];
+  if (::pipe(told) != 0)
+    return 0;
   // Qt's notes on the missing runtime folder of a headless machine would fill the table.
-  posix_spawn_file_actions_t quiet;
-  posix_spawn_file_actions_init(&quiet);
-  posix_spawn_file_actions_addopen(&quiet, STDERR_FILENO, "/dev/null", O_WRONLY, 0);
+  posix_spawn_file_actions_t actions;
+  posix_spawn_file_actions_init(&actions);
+  posix_spawn_file_actions_addopen(&actions, STDERR_FILENO, "/dev/null", O_WRONLY, 0);
+  posix_spawn_file_actions_adddup2(&actions, told[1], STDOUT_FILENO);
+  posix_spawn_file_actions_addclose(&actions, told[0]);
   pid_t child = 0;
-  const int spawned = posix_spawn(&child, self.c_str(), &quiet, nullptr, args, environ);
-  posix_spawn_file_actions_destroy(&quiet);
+  const int spawned = posix_spawn(&child, self.c_str(), &actions, nullptr, args, environ);
+  posix_spawn_file_actions_destroy(&actions);
+  ::close(told[1]);
+  std::string text;
+  char buffer[256];
+  for (ssize_t got; (got = ::read(told[0], buffer, sizeof buffer)) > 0;)
+    text.append(buffer, static_cast<size_t>(got));
+  ::close(told[0]);
   if (spawned != 0)
     return 0;
   int status = 0;
-  rusage usage{};
-  wait4(child, &status, 0, &usage);
-  return static_cast<double>(usage.ru_maxrss) / 1024.0;
+  ::waitpid(child, &status, 0);
+  return std::atof(text.c_str()) / 1024.0;
+}
+
+// This process's peak resident size in KiB, from the kernel's high-water mark.
+double PeakKiB() {
+  std::ifstream status("/proc/self/status");
+  std::string line;
+  while (std::getline(status, line))
+    if (line.rfind("VmHWM:", 0) == 0)
+      return std::atof(line.c_str() + 6);
+  return 0;
 }
 
 double Median(std::vector<double> values) {
@@ -84,27 +106,40 @@ double Median(std::vector<double> values) {
 int ShowWindowAndEnd(const fs::path &game, int argc, char **argv) {
   QApplication app(argc, argv);
   ShowWindow(game).release();
+  std::printf("%.0f\n", PeakKiB());
   std::fflush(stdout);
   // What the player waits for ends here; tearing down is not part of it.
   ::_exit(0);
 }
 
 void BenchStartUp(const fs::path &root, int pairs) {
-  const BenchGame big = MakeLibrary(root, "big-library", 5000, 500);
   const BenchGame empty = MakeLibrary(root, "empty-library", 0, 0);
-  std::vector<double> bigMiB, emptyMiB;
-  const Side ours{[] {}, [&] { bigMiB.push_back(RunChild(big)); }};
-  const Side plain{[] {}, [&] { emptyMiB.push_back(RunChild(empty)); }};
-  PrintResult("start-up to the window shown, 5,000 folders / empty library",
-              RunPairs(pairs, ours, plain), 1.3);
-  const double added = Median(bigMiB) - Median(emptyMiB);
-  std::printf("%-58s %+8.2f MiB peak memory over an empty library  aim +10 MiB %s\n",
-              "start-up, 5,000 folders", added, added <= 10 ? "met" : "NOT MET");
+  struct Size {
+    int folders;
+    const char *count;
+    double aim, aimMiB;
+  };
+  std::unique_ptr<MainWindow> shown;
+  for (const Size size : {Size{5000, "5,000", 1.3, 10}, Size{50000, "50,000", 1.5, 5}}) {
+    const BenchGame big = MakeLibrary(root, "library" + std::to_string(size.folders), size.folders,
+                                      size.folders / 10);
+    std::vector<double> bigMiB, emptyMiB;
+    const Side ours{[] {}, [&] { bigMiB.push_back(RunChild(big)); }};
+    const Side plain{[] {}, [&] { emptyMiB.push_back(RunChild(empty)); }};
+    const std::string folders = std::string(size.count) + " folders";
+    PrintResult("start-up to the window shown, " + folders + " / empty library",
+                RunPairs(pairs, ours, plain), size.aim);
+    const double added = Median(bigMiB) - Median(emptyMiB);
+    std::printf("%-58s %+8.2f MiB peak memory over an empty library  aim +%.0f MiB %s\n",
+                ("start-up, " + folders).c_str(), added, size.aimMiB,
+                added <= size.aimMiB ? "met" : "NOT MET");
 
-  // The first window of a process loads fonts and styles: not part of either side.
-  std::unique_ptr<MainWindow> shown = ShowWindow(empty.game);
-  const Side oursWindow{[&] { shown.reset(); }, [&] { shown = ShowWindow(big.game); }};
-  const Side plainWindow{[&] { shown.reset(); }, [&] { shown = ShowWindow(empty.game); }};
-  PrintResult("  of which the window alone, in a running program",
-              RunPairs(pairs, oursWindow, plainWindow), 0);
+    // The first window of a process loads fonts and styles: not part of either side.
+    if (!shown)
+      shown = ShowWindow(empty.game);
+    const Side oursWindow{[&] { shown.reset(); }, [&] { shown = ShowWindow(big.game); }};
+    const Side plainWindow{[&] { shown.reset(); }, [&] { shown = ShowWindow(empty.game); }};
+    PrintResult("  of which the window alone, in a running program",
+                RunPairs(pairs, oursWindow, plainWindow), 0);
+  }
 }

@@ -5,7 +5,6 @@
 
 #include "base/text_encoding.h"
 
-#include <iterator>
 #include <unordered_map>
 
 namespace fs = std::filesystem;
@@ -21,29 +20,31 @@ void BuildFolderRows(FolderGrid &grid, const std::vector<std::string> &codes,
   grid.ClearFolders();
   grid.library = library;
   // Group the folders by first character once, so each category line costs only its own rows.
-  // Letters are characters, compared as the category file's letters are read.
-  std::unordered_map<std::string, std::vector<GridRow>> byLetter;
-  for (std::string &name : folderNames) {
-    if (name.empty() || IsReservedFolder(name))
-      continue;
-    GridRow row;
-    row.name = std::move(name);
-    byLetter[FirstCharacterOf(row.name).text].push_back(std::move(row));
-  }
-  // A letter on two category lines shows its folders twice: only the last line takes the rows.
+  // Letters are characters, compared as the category file's letters are read. The groups hold
+  // positions and the rows are made once, in place: a large library's names are not held twice.
+  std::unordered_map<std::string, std::vector<size_t>> byLetter;
+  for (size_t i = 0; i < folderNames.size(); ++i)
+    if (!folderNames[i].empty() && !IsReservedFolder(folderNames[i]))
+      byLetter[FirstCharacterOf(folderNames[i]).text].push_back(i);
+  // A letter on two category lines shows its folders twice: only the last line takes the names.
   std::unordered_map<std::string, size_t> lastLine;
-  for (size_t line = 0; line < codes.size(); ++line)
+  size_t rowCount = grid.rows.size();
+  for (size_t line = 0; line < codes.size(); ++line) {
     lastLine[codes[line]] = line;
+    if (const auto grouped = byLetter.find(codes[line]); grouped != byLetter.end())
+      rowCount += grouped->second.size();
+  }
+  grid.rows.reserve(rowCount);
   for (size_t line = 0; line < codes.size(); ++line) {
     const std::string &letter = codes[line];
     const auto grouped = byLetter.find(letter);
     if (letter.empty() || grouped == byLetter.end())
       continue;
-    std::vector<GridRow> &rows = grouped->second;
-    if (line == lastLine[letter])
-      grid.rows.insert(grid.rows.end(), std::make_move_iterator(rows.begin()),
-                       std::make_move_iterator(rows.end()));
-    else
-      grid.rows.insert(grid.rows.end(), rows.begin(), rows.end());
+    const bool last = line == lastLine[letter];
+    for (const size_t i : grouped->second) {
+      GridRow row;
+      row.name = last ? std::move(folderNames[i]) : folderNames[i];
+      grid.rows.push_back(std::move(row));
+    }
   }
 }

@@ -4,26 +4,28 @@
 #include "library/grid_click.h"
 #include "library/loaded_record.h"
 
-#include <algorithm>
 #include <unordered_map>
 #include <vector>
 
 void ReplayRecord(LibraryState &state, Caption &caption, Failures &failures) {
   const ReadyGuard replaying(state, false);
   FolderGrid &grid = state.Unigrid;
-  // Index the rows by name once, so that a long record costs no more than the grid itself.
-  std::unordered_multimap<std::string, int> rowsByName;
+  // Index the recorded names, not the rows, and find their rows in one pass: a library of tens
+  // of thousands of folders then costs no copy of its names.
+  const std::vector<std::string> lines = ReadLoadedNames(state, failures);
+  std::unordered_map<std::string, std::vector<int>> rowsByName;
+  for (const std::string &line : lines) {
+    rowsByName[line];
+    rowsByName[TextAsUtf8(line)];
+  }
   for (int row = 1; row < grid.RowCount(); ++row)
-    rowsByName.emplace(grid.Row(row).name, row);
+    if (const auto found = rowsByName.find(grid.Row(row).name); found != rowsByName.end())
+      found->second.push_back(row);
   std::vector<int> recorded;
-  for (const std::string &line : ReadLoadedNames(state, failures)) {
+  for (const std::string &line : lines) {
     // A record written in Windows-1252 names the folders that UTF-8 names differently.
-    const std::string name = rowsByName.count(line) ? line : TextAsUtf8(line);
-    auto [first, last] = rowsByName.equal_range(name);
-    std::vector<int> rows;
-    for (auto it = first; it != last; ++it)
-      rows.push_back(it->second);
-    std::sort(rows.begin(), rows.end());
+    const std::vector<int> &named = rowsByName[line];
+    const std::vector<int> rows = named.empty() ? rowsByName[TextAsUtf8(line)] : named;
     for (int row : rows) {
       grid.Row(row).mark.clear();
       grid.ColourRow(row, kLoadedColour);
