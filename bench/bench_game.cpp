@@ -27,7 +27,10 @@ void WriteBytes(const fs::path &path, size_t size) {
 BenchGame MakeGame(const fs::path &root, const std::string &name, const std::string &categories,
                    int ownFiles) {
   BenchGame made{root / name, root / name / "ZEP128"};
+  // As in every installed game: without them, each click would look for them in another letter
+  // case, listing the game folder.
   fs::create_directories(made.game / "Savedata");
+  fs::create_directories(made.game / "Music");
   fs::create_directories(made.library);
   std::ofstream(made.library / "zep.ini", std::ios::binary) << categories;
   for (int i = 0; i < ownFiles; ++i)

@@ -1,8 +1,8 @@
 // Measures the program's file work and start-up as ratios against plain baselines in paired
 // rounds, on tmpfs when the machine has one and on the temporary folder's own file system.
-// Usage: selector_bench [pairs [setups | startup | clone <folder>]]   (at least 9; 9 when not
-// given; "setups" or "startup" runs only those lines, "clone" only the load of big files in
-// <folder>, which scripts/bench_reflink.sh mounts). It starts itself with
+// Usage: selector_bench [pairs [files | setups | startup | clone <folder>]]   (at least 9; 9 when
+// not given; "files", "setups" or "startup" runs only those lines, "clone" only the load of big
+// files in <folder>, which scripts/bench_reflink.sh mounts). It starts itself with
 // "--show-window <game folder>" for each timed start-up.
 
 #include "bench/file_work.h"
@@ -92,7 +92,7 @@ int main(int argc, char **argv) {
     PrintHeading("== " + base.string() + " (" + MountOf(base) + "), " + std::to_string(pairs) +
                  " pairs ==");
     const std::string only = argc > 2 ? argv[2] : "";
-    if (only.empty())
+    if (only.empty() || only == "files")
       BenchFileWork(root, pairs);
     if (only.empty() || only == "setups")
       BenchSetups(root, pairs);

@@ -27,7 +27,7 @@ trap 'rm -rf "$work"' EXIT
 template="$work/template"
 game="$work/game"
 # Each call is swept on its own, so that N counts the calls of that one.
-calls=(rename renameat renameat2 unlink unlinkat write sendfile mkdir fchmodat)
+calls=(rename renameat renameat2 unlink unlinkat write sendfile copy_file_range mkdir fchmodat)
 
 random_file() { head -c "${2:-3000}" /dev/urandom >"$1"; }
 
