@@ -76,23 +76,26 @@ fs::path PartialPath(const fs::path &target) {
   return Child(target.parent_path(), name + ".partial");
 }
 
-void FlushFolder([[maybe_unused]] const fs::path &folder) {
 #ifndef _WIN32
+// Calls `flush` with an open descriptor of `folder`; nothing when it cannot be opened.
+static void FlushThrough(const fs::path &folder, int (*flush)(int)) {
   const int descriptor = ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
   if (descriptor >= 0) {
-    ::fsync(descriptor);
+    flush(descriptor);
     ::close(descriptor);
   }
+}
+#endif
+
+void FlushFolder([[maybe_unused]] const fs::path &folder) {
+#ifndef _WIN32
+  FlushThrough(folder, ::fsync);
 #endif
 }
 
 void FlushFileSystem([[maybe_unused]] const fs::path &folder) {
 #ifndef _WIN32
-  const int descriptor = ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
-  if (descriptor >= 0) {
-    ::syncfs(descriptor);
-    ::close(descriptor);
-  }
+  FlushThrough(folder, ::syncfs);
 #endif
 }
 

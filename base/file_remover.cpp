@@ -3,8 +3,8 @@
 #include "base/file_ops.h"
 #include "base/links.h"
 #include "base/names.h"
-#include "base/step_seam.h"
 #include "base/new_file.h"
+#include "base/step_seam.h"
 
 #include <cerrno>
 #include <system_error>
