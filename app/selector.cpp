@@ -31,16 +31,14 @@ void Selector::StartUp(Failures &failures) {
   FinishInterrupted(state_, caption_, failures);
   RemovePartial(PartialPath(IniPath(state_.EAWDir)));
   RemovePartial(PartialPath(CategoryPath(state_.LibDir)));
-  state_.Ready = false;
   const std::vector<SkippedLine> skipped = PrepareLibrary(state_, failures);
   BuildGrid(state_, state_.Codes);
   EnsureRecord(state_, failures);
   MendRecordFromLedger(state_, caption_, failures);
-  ReplayRecord(state_, caption_, failures);
+  ReplayRecord(state_, failures);
   state_.BackPic = GamePicture(state_.EAWDir, "background");
   state_.NewPic = GamePicture(state_.EAWDir, "newpic");
   ShowCategory(0);
-  state_.Ready = true;
   if (!skipped.empty())
     for (const std::string &line : SkippedLinesMessage(skipped))
       failures.Add(line);
@@ -114,8 +112,8 @@ std::string Selector::PressKey(int row, int key, Failures &failures) {
 // The names of the grid's folders, each once (a letter listed twice shows its folders twice).
 static std::set<std::string> FolderNames(const FolderGrid &grid) {
   std::set<std::string> names;
-  for (int row = 1; row < grid.RowCount(); ++row)
-    names.insert(grid.Row(row).name);
+  for (const GridRow &row : grid.rows)
+    names.insert(row.name);
   return names;
 }
 
@@ -135,16 +133,14 @@ static std::string RefreshSummary(const std::set<std::string> &before,
 
 void Selector::RefreshLibrary(Failures &failures) {
   const std::set<std::string> before = FolderNames(state_.Unigrid);
-  state_.Ready = false;
   // Start-up writes both files when missing; a rebuild needs them just the same.
   EnsureCategoryFile(state_.LibDir, failures);
   BuildGrid(state_, LibraryCategories(state_.LibDir, failures).codes);
   EnsureRecord(state_, failures);
-  ReplayRecord(state_, caption_, failures);
+  ReplayRecord(state_, failures);
   // The rows under the pointer are other folders now, so the next move rebuilds the preview.
-  state_.hoveredRow = -1;
+  state_.hoveredRow.reset();
   ShowCategory(state_.shownCategory);
-  state_.Ready = true;
   state_.summary = RefreshSummary(before, FolderNames(state_.Unigrid));
 }
 
@@ -176,13 +172,10 @@ std::optional<FolderPreview> Selector::HoverRow(int row) {
   return PreviewOfRow(state_, row);
 }
 
-IniValues Selector::ReadSettings(Failures &failures) {
-  const ReadyGuard reading(state_, false);
-  return IniRead(state_.EAWDir, failures);
-}
+IniValues Selector::ReadSettings(Failures &failures) { return IniRead(state_.EAWDir, failures); }
 
 void Selector::SaveSettings(const IniTexts &texts, Failures &failures) {
-  const int saved = inisave(state_.EAWDir, state_.Ready, texts, failures);
+  const int saved = inisave(state_.EAWDir, texts, failures);
   state_.summary = saved < 0 ? ""
                              : std::to_string(saved) + (saved == 1 ? " setting" : " settings") +
                                    " saved to eaw.ini";

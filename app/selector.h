@@ -39,7 +39,7 @@ public:
   std::string ClickRow(int row, Failures &failures);
   // A key pressed on grid row `row`: Enter acts as a click.
   std::string PressKey(int row, int key, Failures &failures);
-  // The next shown row from `from` on whose name starts with the typed `prefix`; 0 for none.
+  // The next shown row from `from` on whose name starts with the typed `prefix`; -1 for none.
   int FindRow(int from, const std::string &prefix) const {
     return state_.Unigrid.FindShownRow(from, prefix);
   }
@@ -54,11 +54,11 @@ public:
   // Unloads every loaded folder, deletes the add-on files `names` from the game folder, puts the
   // kept originals back and empties the record.
   void ResetAll(const std::vector<std::string> &names, Failures &failures);
-  // The preview of grid row `row` when the pointer has entered it; nothing when it was already
-  // over that row.
+  // The preview of grid row `row` (-1 for the grid's header) when the pointer has entered it;
+  // nothing when it was already over that row.
   std::optional<FolderPreview> HoverRow(int row);
   // The pointer left the grid and the preview was cleared: the next row entered shows again.
-  void LeaveGrid() { state_.hoveredRow = -1; }
+  void LeaveGrid() { state_.hoveredRow.reset(); }
   // The six settings of eaw.ini as the boxes show them.
   IniValues ReadSettings(Failures &failures);
   // Writes the six box texts into eaw.ini; the summary says how many were saved.

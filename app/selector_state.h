@@ -3,6 +3,7 @@
 #include "library/library_state.h"
 
 #include <filesystem>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -12,7 +13,7 @@ struct SelectorState : LibraryState {
   std::vector<std::string> Codes; // Codes[k] is the letter of List3 entry k + 2
   std::filesystem::path BackPic;  // empty when there is no background picture
   std::filesystem::path NewPic;   // the General Settings page's picture; empty for none
-  int hoveredRow = -1;            // the grid row whose preview is shown; -1 for none
+  std::optional<int> hoveredRow;  // the grid row whose preview is shown, -1 the header
   int shownCategory = 0;          // the category list entry the grid shows
   std::string summary;            // the line that sums up the last action; empty for none
 };

@@ -59,10 +59,10 @@ public:
 
   void Click() {
     Failures failures;
-    quiet_->selector.ClickRow(1, failures);
+    quiet_->selector.ClickRow(0, failures);
     StopOnFailures(failures);
   }
-  bool Loaded() const { return IsLoaded(quiet_->selector.State().Unigrid.Row(1)); }
+  bool Loaded() const { return IsLoaded(quiet_->selector.State().Unigrid.Row(0)); }
   void Unload() {
     if (Loaded())
       Click();
@@ -335,12 +335,12 @@ void BenchCloneLoad(const fs::path &root, int pairs) {
   Failures failures;
   quiet.selector.StartUp(failures);
   const auto clear = [&] {
-    if (IsLoaded(quiet.selector.State().Unigrid.Row(1)))
-      quiet.selector.ClickRow(1, failures);
+    if (IsLoaded(quiet.selector.State().Unigrid.Row(0)))
+      quiet.selector.ClickRow(0, failures);
     PlainRemovals(copies);
   };
   PrintResult("load 20 x 50 MB, reflink file system / copy loop",
-              RunPairs(pairs, {clear, [&] { quiet.selector.ClickRow(1, failures); }},
+              RunPairs(pairs, {clear, [&] { quiet.selector.ClickRow(0, failures); }},
                        {clear, [&] { PlainCopies(copies); }}),
               0.05);
   clear();

@@ -49,7 +49,7 @@ public:
     Failures failures;
     quiet_.selector.StartUp(failures);
     const FolderGrid &grid = quiet_.selector.State().Unigrid;
-    for (int row = 1; row < grid.RowCount(); ++row)
+    for (int row = 0; row < grid.RowCount(); ++row)
       rows_[grid.Row(row).name] = row;
     for (const char *set : {"A", "B"}) {
       ClickAll(sets_[set]);

@@ -16,31 +16,31 @@ static bool InCategory(std::string_view name, const std::string &letter) {
 }
 
 static void ShowAll(FolderGrid &grid) {
-  for (size_t row = 1; row < grid.rows.size(); ++row)
-    grid.rows[row].height = kRowHeight;
+  for (GridRow &row : grid.rows)
+    row.shown = true;
 }
 
 // Shows the loaded rows only; the current cell ends on the last of them.
 static void ShowSelections(FolderGrid &grid) {
-  for (size_t row = 1; row < grid.rows.size(); ++row) {
-    const bool loaded = IsLoaded(grid.rows[row]);
-    grid.rows[row].height = loaded ? kRowHeight : 0;
+  for (int row = 0; row < grid.RowCount(); ++row) {
+    const bool loaded = IsLoaded(grid.Row(row));
+    grid.Row(row).shown = loaded;
     if (loaded)
-      grid.ColourRow(static_cast<int>(row), kLoadedColour);
+      grid.MarkRow(row, true);
   }
 }
 
 static void ShowLetter(FolderGrid &grid, const std::string &letter) {
-  for (size_t row = 1; row < grid.rows.size(); ++row)
-    grid.rows[row].height = InCategory(grid.rows[row].name, letter) ? kRowHeight : 0;
+  for (GridRow &row : grid.rows)
+    row.shown = InCategory(row.name, letter);
   const bool several = letter.size() == 1 && AllowsSeveralLoaded(letter[0]);
-  grid.rows[0].name = several ? kMultipleSelectionText : kSingleSelectionText;
+  grid.rule = several ? kMultipleSelectionText : kSingleSelectionText;
 }
 
 std::string ShowCategory(FolderGrid &grid, const std::vector<std::string> &codes, int k) {
   if (k < 0)
     return "";
-  grid.rows[0].name = kAllFoldersText;
+  grid.rule = kAllFoldersText;
   if (k == kShowAllEntry) {
     ShowAll(grid);
     return "";

@@ -16,6 +16,6 @@ inline constexpr int kShowSelectionsEntry = 1;
 inline constexpr int kFirstCategoryEntry = 2;
 
 // Shows category list entry `k` (0 "Show ALL", 1 "Show Selections", then the categories whose
-// letters are `codes`): shows and hides folder rows by height in one pass and sets the header
-// text. Returns the text for the code-letter label. A negative `k` (no entry) changes nothing.
+// letters are `codes`): shows and hides folder rows in one pass and sets the grid's rule text.
+// Returns the text for the code-letter label. A negative `k` (no entry) changes nothing.
 std::string ShowCategory(FolderGrid &grid, const std::vector<std::string> &codes, int k);

@@ -41,7 +41,7 @@ void FindConflicts(const LibraryState &state, FolderFileList &list,
                    const std::unordered_map<std::string, size_t> &byKey) {
   std::unordered_set<std::string> seen{list.folder};
   const FolderGrid &grid = state.Unigrid;
-  for (int row = 1; row < grid.RowCount(); ++row) {
+  for (int row = 0; row < grid.RowCount(); ++row) {
     const std::string &other = grid.Row(row).name;
     if (!seen.insert(other).second)
       continue;

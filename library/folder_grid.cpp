@@ -9,26 +9,26 @@ bool AllowsSeveralLoaded(char letter) {
 }
 
 int FolderGrid::FindShownRow(int from, std::string_view prefix) const {
-  const int count = RowCount() - 1;
+  const int count = RowCount();
   const std::string wanted = FoldName(prefix);
   for (int step = 0; step < count; ++step) {
-    const int row = 1 + ((from - 1 + step) % count + count) % count;
+    const int row = ((from + step) % count + count) % count;
     const GridRow &candidate = Row(row);
-    if (candidate.height > 0 && FoldName(candidate.name).compare(0, wanted.size(), wanted) == 0)
+    if (candidate.shown && FoldName(candidate.name).compare(0, wanted.size(), wanted) == 0)
       return row;
   }
-  return 0;
+  return -1;
 }
 
-void FolderGrid::ColourRow(int row, std::uint32_t colour) {
+void FolderGrid::MarkRow(int row, bool loaded) {
   currentRow = row;
   currentCol = 1;
-  Row(row).nameColour = colour;
+  Row(row).loaded = loaded;
 }
 
 std::filesystem::path FolderGrid::PathOf(int row) const { return Child(library, Row(row).name); }
 
 void FolderGrid::ClearFolders() {
-  rows.resize(1);
-  currentRow = 0;
+  rows.clear();
+  currentRow = -1;
 }

@@ -8,7 +8,6 @@
 #include "library/loaded_record.h"
 #include "library/move_in.h"
 #include "library/move_out.h"
-#include "slots/plane_set.h"
 #include "slots/slot_grid.h"
 
 namespace fs = std::filesystem;
@@ -16,32 +15,21 @@ namespace fs = std::filesystem;
 namespace {
 
 constexpr char kCampaign = 'C';
-constexpr char kFlightModel = 'F';
 
-void MarkLoaded(LibraryState &state, int row) {
-  state.Unigrid.ColourRow(row, kLoadedColour);
-  state.Unigrid.Row(row).mark = kLoadedMark;
-}
-
-void MarkNotLoaded(LibraryState &state, int row) {
-  state.Unigrid.ColourRow(row, state.GridBackColor);
-  state.Unigrid.Row(row).mark.clear();
-}
-
-// The first loaded row of `letter`, or 0.
+// The first loaded row of `letter`, or -1.
 int FirstLoaded(const FolderGrid &grid, char letter) {
-  for (int row = 1; row < grid.RowCount(); ++row)
+  for (int row = 0; row < grid.RowCount(); ++row)
     if (IsLoaded(grid.Row(row)) && Letter(grid.Row(row)) == letter)
       return row;
-  return 0;
+  return -1;
 }
 
-// The last loaded row whose first character is `letter`, or 0.
+// The last loaded row whose first character is `letter`, or -1.
 int LastLoaded(const FolderGrid &grid, const std::string &letter) {
-  for (int row = grid.RowCount() - 1; row >= 1; --row)
+  for (int row = grid.RowCount() - 1; row >= 0; --row)
     if (IsLoaded(grid.Row(row)) && FirstCharacterOf(grid.Row(row).name).text == letter)
       return row;
-  return 0;
+  return -1;
 }
 
 // Loads the folder of `row` and marks it loaded, even when some files could not be copied: those
@@ -53,10 +41,8 @@ std::vector<std::string> Load(LibraryState &state, int row, Caption &caption, Fa
   // A folder that was not loaded at all is not marked: there is nothing to unload.
   if (!overwritten)
     return {};
-  MarkLoaded(state, row);
+  state.Unigrid.MarkRow(row, true);
   SaveLoaded(state, failures);
-  if (!state.Ready)
-    return *overwritten;
   Journal::Remove(KeepingFolder(state.LibDir));
   if (failures.Lines().size() > before)
     failures.SetHeading("\"" + state.Unigrid.Row(row).name +
@@ -73,26 +59,17 @@ std::vector<std::string> ClickCampaign(LibraryState &state, int clicked, Caption
                                        Failures &failures) {
   const fs::path folder = state.Unigrid.PathOf(clicked);
   if (IsLoaded(state.Unigrid.Row(clicked))) {
-    MarkNotLoaded(state, clicked);
+    state.Unigrid.MarkRow(clicked, false);
     MoveOut(state, folder, caption, failures);
     SaveLoaded(state, failures);
     return {};
   }
   const int other = FirstLoaded(state.Unigrid, kCampaign);
-  if (other != 0) {
-    MarkNotLoaded(state, other);
+  if (other >= 0) {
+    state.Unigrid.MarkRow(other, false);
     MoveOut(state, state.Unigrid.PathOf(other), caption, failures);
   }
   return Load(state, clicked, caption, failures);
-}
-
-void ShowPlaneSets(LibraryState &state, const fs::path &folder, Failures &failures) {
-  const bool planeSetFound = !PlaneSetFolders(folder).empty();
-  state.Slots.columns = kSlotColumns;
-  if (planeSetFound)
-    GridSet(state.Slots, state.GridBackColor, folder, failures);
-  SaveLoaded(state, failures);
-  state.Slots.frameVisible = planeSetFound;
 }
 
 std::vector<std::string> ClickOther(LibraryState &state, int clicked, Caption &caption,
@@ -100,7 +77,7 @@ std::vector<std::string> ClickOther(LibraryState &state, int clicked, Caption &c
   const char letter = Letter(state.Unigrid.Row(clicked));
   if (IsLoaded(state.Unigrid.Row(clicked))) {
     Udel(state, clicked, caption, failures);
-    if (letter == kFlightModel) {
+    if (letter == kFlightModelLetter) {
       state.Slots.rows.clear();
       state.Slots.frameVisible = false;
     }
@@ -109,18 +86,20 @@ std::vector<std::string> ClickOther(LibraryState &state, int clicked, Caption &c
   }
   const int other =
       AllowsSeveralLoaded(letter)
-          ? 0
+          ? -1
           : LastLoaded(state.Unigrid, FirstCharacterOf(state.Unigrid.Row(clicked).name).text);
-  if (other != 0) {
-    if (letter == kFlightModel)
+  if (other >= 0) {
+    if (letter == kFlightModelLetter)
       state.Slots.frameVisible = false;
     // Unmarked first, so that the record written by the unload no longer names it.
-    MarkNotLoaded(state, other);
+    state.Unigrid.MarkRow(other, false);
     MoveOut(state, state.Unigrid.PathOf(other), caption, failures);
   }
   const std::vector<std::string> overwritten = Load(state, clicked, caption, failures);
-  if (letter == kFlightModel)
-    ShowPlaneSets(state, state.Unigrid.PathOf(clicked), failures);
+  if (letter == kFlightModelLetter) {
+    GridSet(state.Slots, state.Unigrid.PathOf(clicked), failures);
+    SaveLoaded(state, failures);
+  }
   return overwritten;
 }
 
@@ -134,7 +113,7 @@ std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption
   if (!state.Unigrid.IsFolderRow(row))
     return {};
   const GridRow &clicked = state.Unigrid.Row(row);
-  if (state.Ready && !IsLoaded(clicked)) {
+  if (!IsLoaded(clicked)) {
     const fs::path folder = state.Unigrid.PathOf(row);
     const bool found = FolderCheck(folder);
     // Windows lists a folder whose name it cannot keep, but finds no folder of that name.
@@ -151,7 +130,7 @@ std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption
     // Loading makes the folder's files writable: never those of a folder elsewhere.
     if (RefusedForLink(state, folder, "nothing was loaded", failures))
       return {};
-  } else if (state.Ready && RefusedForLink(state, {}, "nothing was unloaded", failures)) {
+  } else if (RefusedForLink(state, {}, "nothing was unloaded", failures)) {
     return {};
   }
   if (Letter(clicked) == kCampaign)

@@ -11,10 +11,9 @@ namespace library {
 
 // A click on grid row `row`, which becomes the current row: loads a folder that is not loaded,
 // unloads one that is, keeping the campaign and single-selection rules, and drives the slot grid
-// for flight-model folders. A click on the header row or past the grid is ignored, and so is one
-// on a folder that is no longer in the library (said in `failures`). While `Ready` is false it
-// only marks and colours rows: no file is copied, deleted or moved. Returns the loaded folders
-// whose files the load replaced.
+// for flight-model folders. A click outside the grid's rows is ignored, and so is one on a folder
+// that is no longer in the library (said in `failures`). Returns the loaded folders whose files
+// the load replaced.
 std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption,
                                   Failures &failures);
 

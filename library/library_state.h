@@ -3,7 +3,6 @@
 #include "library/folder_grid.h"
 #include "slots/slot_table.h"
 
-#include <cstdint>
 #include <filesystem>
 
 // What the last operation did to the game's files, for the line that sums it up.
@@ -13,13 +12,11 @@ struct Tally {
   int restored = 0; // files put back: another loaded folder's copy or a kept original
 };
 
-// What loading, unloading, the record and the grid views share: the paths, the `Ready` flag, the
-// folder grid and the slot panel.
+// What loading, unloading, the record and the grid views share: the paths, the folder grid and
+// the slot panel.
 struct LibraryState {
   std::filesystem::path EAWDir;
   std::filesystem::path LibDir;
-  bool Ready = false;
-  std::uint32_t GridBackColor = 0; // 0 shows as the grid's default white
   FolderGrid Unigrid;
   SlotPanel Slots;
   Tally tally;
@@ -27,18 +24,3 @@ struct LibraryState {
 
 // The library state for the game folder `eawDir`, with `LibDir` (its "ZEP128" in any case).
 LibraryState LibraryFor(const std::filesystem::path &eawDir);
-
-// Sets `Ready` for one operation and puts back what it was when the operation ends.
-class ReadyGuard {
-public:
-  ReadyGuard(LibraryState &state, bool ready) : ready_(state.Ready), saved_(state.Ready) {
-    ready_ = ready;
-  }
-  ~ReadyGuard() { ready_ = saved_; }
-  ReadyGuard(const ReadyGuard &) = delete;
-  ReadyGuard &operator=(const ReadyGuard &) = delete;
-
-private:
-  bool &ready_;
-  bool saved_;
-};

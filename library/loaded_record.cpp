@@ -18,18 +18,13 @@ std::string RecordText(const FolderGrid &grid) {
   std::string text;
   // A folder listed under two categories of one letter has two rows, yet is loaded once.
   std::unordered_set<std::string> written;
-  for (int row = 1; row < grid.RowCount(); ++row) {
-    const GridRow &r = grid.rows[static_cast<size_t>(row)];
-    if (IsLoaded(r) && written.insert(r.name).second)
-      text += r.name + "\r\n";
-  }
+  for (const GridRow &row : grid.rows)
+    if (IsLoaded(row) && written.insert(row.name).second)
+      text += row.name + "\r\n";
   return text + "\r\n";
 }
 
 void SaveLoaded(LibraryState &state, Failures &failures) {
-  if (!state.Ready)
-    return;
-  const ReadyGuard writing(state, false);
   WriteAtomically(RecordPath(state), RecordText(state.Unigrid), failures);
 }
 

@@ -11,7 +11,7 @@
 std::filesystem::path RecordPath(const LibraryState &state);
 // The record's bytes for the grid: each loaded name and CR LF, then one more CR LF.
 std::string RecordText(const FolderGrid &grid);
-// Rewrites the record from the grid's marks, atomically; does nothing while `Ready` is false.
+// Rewrites the record from the grid's loaded rows, atomically.
 void SaveLoaded(LibraryState &state, Failures &failures);
 // The record's non-empty lines; a missing or unreadable record gives none.
 std::vector<std::string> ReadLoadedNames(const LibraryState &state, Failures &failures);

@@ -109,7 +109,7 @@ void PutOriginalBack(const fs::path &kept, const fs::path &destination, Failures
 
 std::optional<std::vector<std::string>> MoveIn(LibraryState &state, const fs::path &folder,
                                                Caption &caption, Failures &failures) {
-  if (!state.Ready || folder == state.EAWDir)
+  if (folder == state.EAWDir)
     return std::vector<std::string>{};
   CaptionRestorer restorer(caption);
   const fs::path keeping = KeepingFolder(state.LibDir);

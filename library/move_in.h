@@ -16,7 +16,7 @@
 // is kept already, the game's file is not replaced. When a copy fails after its original was
 // kept, the original goes back at once. The
 // journal is left at "loaded" for the caller to close once the record is written. Does nothing
-// while `Ready` is false or when `folder` is the game folder. A file that cannot be copied is
+// when `folder` is the game folder. A file that cannot be copied is
 // skipped and recorded in `failures`. Returns the loaded folders whose files it replaced; nothing,
 // with the reason in `failures`, when the folder was not loaded at all (it cannot be listed, or
 // the journal cannot be written).

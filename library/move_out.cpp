@@ -12,8 +12,6 @@
 namespace fs = std::filesystem;
 
 void MoveOut(LibraryState &state, const fs::path &folder, Caption &caption, Failures &failures) {
-  if (!state.Ready)
-    return;
   if (IsCampaignFolder(folder) && IsLink(folder))
     RefuseLink(folder, "the saved games stay in Savedata", failures);
   else if (IsCampaignFolder(folder))
@@ -49,8 +47,7 @@ void Udel(LibraryState &state, int row, Caption &caption, Failures &failures) {
   FolderGrid &grid = state.Unigrid;
   if (!grid.IsFolderRow(row))
     return;
-  grid.Row(row).mark.clear();
-  grid.ColourRow(row, state.GridBackColor);
+  grid.MarkRow(row, false);
   const fs::path folder = grid.PathOf(row);
   MoveOut(state, folder, caption, failures);
 }

@@ -37,7 +37,7 @@ FolderPreview PreviewOf(const fs::path &folder) {
 }
 
 FolderPreview PreviewOfRow(const LibraryState &state, int row) {
-  if (row < 1 || row >= state.Unigrid.RowCount())
+  if (!state.Unigrid.IsFolderRow(row))
     return {};
   return PreviewOf(state.Unigrid.PathOf(row));
 }

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "base/caption.h"
 #include "base/failures.h"
 #include "library/library_state.h"
 
-// Marks the rows named in the loaded-folders record as loaded, through the grid click with
-// `Ready` false, so that no file is touched; every recorded row ends marked, also two of a letter
-// that allows one loaded folder.
-void ReplayRecord(LibraryState &state, Caption &caption, Failures &failures);
+// Marks the rows named in the loaded-folders record as loaded, touching no file and not writing
+// the record: every recorded row ends marked, also two of a letter that allows one loaded folder,
+// so that each can be unloaded. A recorded flight-model folder fills the slot panel as its click
+// did, the last one recorded showing; the last recorded row becomes the current row.
+void ReplayRecord(LibraryState &state, Failures &failures);

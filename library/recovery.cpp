@@ -41,7 +41,6 @@ void FinishInterrupted(LibraryState &state, Caption &caption, Failures &failures
   if (!journal)
     return;
   CaptionRestorer restorer(caption);
-  const ReadyGuard working(state, true);
   switch (journal->step) {
   case Journal::Step::Load:
   case Journal::Step::Unload:

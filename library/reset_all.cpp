@@ -135,10 +135,8 @@ static Journal ResetJournal(const LibraryState &state, const Ledger &ledger,
 
 // The record is now empty, so no row may stay marked: a later click would write it back.
 static void UnmarkAllRows(LibraryState &state) {
-  for (size_t row = 1; row < state.Unigrid.rows.size(); ++row) {
-    state.Unigrid.rows[row].mark.clear();
-    state.Unigrid.rows[row].nameColour = state.GridBackColor;
-  }
+  for (GridRow &row : state.Unigrid.rows)
+    row.loaded = false;
   state.Slots.frameVisible = false;
 }
 
@@ -148,7 +146,6 @@ void ResetAll(LibraryState &state, const std::vector<std::string> &names, Captio
     return;
   {
     CaptionRestorer restorer(caption);
-    state.Ready = true;
     caption.Set("Please wait... cleaning up");
     const Ledger ledger = Ledger::Read(KeepingFolder(state.LibDir), failures);
     // The save files of a loaded campaign go home first, as its unload would carry them.
@@ -163,5 +160,4 @@ void ResetAll(LibraryState &state, const std::vector<std::string> &names, Captio
                    DisplayPath(KeepingFolder(state.LibDir)));
   }
   UnmarkAllRows(state);
-  state.Ready = true;
 }

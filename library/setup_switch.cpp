@@ -15,7 +15,7 @@ std::string Quoted(const std::string &text) { return "\"" + text + "\""; }
 // The first row of each folder name, and the loaded row where one is loaded.
 std::unordered_map<std::string, int> RowsByName(const FolderGrid &grid) {
   std::unordered_map<std::string, int> rows;
-  for (int row = 1; row < grid.RowCount(); ++row) {
+  for (int row = 0; row < grid.RowCount(); ++row) {
     const auto [at, added] = rows.try_emplace(grid.Row(row).name, row);
     if (!added && IsLoaded(grid.Row(row)) && !IsLoaded(grid.Row(at->second)))
       at->second = row;
@@ -92,7 +92,7 @@ void Click(LibraryState &state, int row, const std::string &doing, Caption &capt
 std::vector<std::string> LoadedInOrder(const LibraryState &state, Failures &failures) {
   const FolderGrid &grid = state.Unigrid;
   std::unordered_set<std::string> loaded;
-  for (int row = 1; row < grid.RowCount(); ++row)
+  for (int row = 0; row < grid.RowCount(); ++row)
     if (IsLoaded(grid.Row(row)))
       loaded.insert(grid.Row(row).name);
   std::vector<std::string> order;
@@ -100,7 +100,7 @@ std::vector<std::string> LoadedInOrder(const LibraryState &state, Failures &fail
   for (const LoadedFolder &folder : ledger.Folders())
     if (loaded.erase(folder.name))
       order.push_back(folder.name);
-  for (int row = 1; row < grid.RowCount(); ++row)
+  for (int row = 0; row < grid.RowCount(); ++row)
     if (loaded.erase(grid.Row(row).name))
       order.push_back(grid.Row(row).name);
   return order;

@@ -153,7 +153,7 @@ int main(int argc, char **argv) {
   selector.StartUp(failures);
   if (step == "click") {
     const FolderGrid &grid = selector.State().Unigrid;
-    for (int row = 1; row < grid.RowCount(); ++row)
+    for (int row = 0; row < grid.RowCount(); ++row)
       if (grid.Row(row).name == name) {
         selector.ClickRow(row, failures);
         break;

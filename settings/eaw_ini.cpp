@@ -48,9 +48,7 @@ static int KeysFound(const std::vector<std::string> &lines) {
   return found;
 }
 
-int inisave(const fs::path &eawDir, bool ready, const IniTexts &texts, Failures &failures) {
-  if (!ready)
-    return -1;
+int inisave(const fs::path &eawDir, const IniTexts &texts, Failures &failures) {
   const fs::path path = IniPath(eawDir);
   const std::optional<std::vector<std::string>> lines = ReadLinesIfExists(path, failures);
   if (!lines || !WriteAtomically(path, RewrittenIni(*lines, texts), failures))

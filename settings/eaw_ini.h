@@ -29,8 +29,7 @@ IniValues IniRead(const std::filesystem::path &eawDir, Failures &failures);
 // The file's lines with every line that begins with a key replaced by the key and its box text,
 // each line ended by CR LF.
 std::string RewrittenIni(const std::vector<std::string> &lines, const IniTexts &texts);
-// Writes the six box texts into eaw.ini (Enter in a settings box). Does nothing while `ready` is
-// false or when the file is missing; a read-only file is written and left writable. Returns how
-// many of the keys the file holds, or -1 when it was not written.
-int inisave(const std::filesystem::path &eawDir, bool ready, const IniTexts &texts,
-            Failures &failures);
+// Writes the six box texts into eaw.ini (Enter in a settings box). Does nothing when the file is
+// missing; a read-only file is written and left writable. Returns how many of the keys the file
+// holds, or -1 when it was not written.
+int inisave(const std::filesystem::path &eawDir, const IniTexts &texts, Failures &failures);

@@ -18,13 +18,12 @@ std::string SlotTitle(const std::string &folder, const std::vector<SlotRow> &row
   return title;
 }
 
-void GridSet(SlotPanel &slots, std::uint32_t &GridBackColor, const fs::path &FMfolder,
-             Failures &failures) {
-  GridBackColor = slots.currentCellColour;
+void GridSet(SlotPanel &slots, const fs::path &FMfolder, Failures &failures) {
+  slots.columns = kSlotColumns;
   const std::vector<fs::path> planeSets = PlaneSetFolders(FMfolder);
+  slots.frameVisible = !planeSets.empty();
   if (planeSets.empty())
     return;
-  slots.columns = kSlotColumns;
   slots.rows.clear();
   slots.rows.reserve(planeSets.size());
   for (const fs::path &planeSet : planeSets)

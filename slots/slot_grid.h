@@ -3,7 +3,6 @@
 #include "base/failures.h"
 #include "slots/slot_table.h"
 
-#include <cstdint>
 #include <filesystem>
 #include <string>
 #include <vector>
@@ -12,8 +11,7 @@
 // its rows were read from ("F-Pack: planes.zep").
 std::string SlotTitle(const std::string &folder, const std::vector<SlotRow> &rows);
 
-// Fills the slot grid `slots` from the plane-set folders of the flight-model folder `FMfolder`,
-// in name order, and shows the grid. First takes `GridBackColor` from the slot grid's current
-// cell; a folder without plane-set folders leaves the grid and its label as they were.
-void GridSet(SlotPanel &slots, std::uint32_t &GridBackColor, const std::filesystem::path &FMfolder,
-             Failures &failures);
+// Fills the slot panel `slots` for the loaded flight-model folder `FMfolder` from its plane-set
+// folders, in name order, and shows the panel; a folder without plane-set folders hides it and
+// leaves the grid and its label as they were.
+void GridSet(SlotPanel &slots, const std::filesystem::path &FMfolder, Failures &failures);

@@ -1,6 +1,5 @@
 #pragma once
 
-#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -22,6 +21,5 @@ struct SlotPanel {
   bool gridVisible = false;
   std::string label;
   int columns = kSlotColumns;
-  std::vector<SlotRow> rows;           // data rows; the header row is the window's
-  std::uint32_t currentCellColour = 0; // the slot grid's default cell colour
+  std::vector<SlotRow> rows; // data rows; the header row is the window's
 };

@@ -38,7 +38,6 @@ private:
 
 class WindowsFiles : public ::testing::Test {
 protected:
-  void SetUp() override { state.Ready = true; }
   void Load(const std::string &name) { MoveIn(state, game.Library() / name, caption, failures); }
   void Unload(const std::string &name) { MoveOut(state, game.Library() / name, caption, failures); }
   fs::path InGame(const std::string &name) const { return game.Path() / name; }
@@ -121,7 +120,7 @@ TEST_F(WindowsFiles, ReadOnlyRecordAndSettingsAreReplacedKeepingHiddenAndSystem)
   EXPECT_EQ(game.Record(), "\r\n");
   game.Write("eaw.ini", "Width=1\r\n");
   Give(InGame("eaw.ini"), FILE_ATTRIBUTE_READONLY | FILE_ATTRIBUTE_HIDDEN | FILE_ATTRIBUTE_SYSTEM);
-  inisave(game.Path(), true, {"640"}, failures);
+  inisave(game.Path(), {"640"}, failures);
   EXPECT_EQ(game.Read("eaw.ini"), "Width=640\r\n");
   EXPECT_TRUE(Has(InGame("eaw.ini"), FILE_ATTRIBUTE_HIDDEN));
   EXPECT_TRUE(Has(InGame("eaw.ini"), FILE_ATTRIBUTE_SYSTEM));
@@ -203,7 +202,6 @@ TEST(WindowsNames, PathsAreShownWithWindowsSeparators) {
   game.MakeFolder("one.dat/in the way");
   // The game folder as Qt hands it over, with "/" between names.
   LibraryState state = LibraryFor(fs::path(game.Path()).generic_wstring());
-  state.Ready = true;
   RecordingCaption caption;
   Failures failures;
   MoveIn(state, state.LibDir / "S-One", caption, failures);

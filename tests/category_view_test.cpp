@@ -18,9 +18,9 @@ TEST_F(CategoryView, LettersBeyondAsciiListTheirFoldersAndNoLetterListsTheProgra
   const auto shown = [&](int entry) {
     selector.ShowCategory(entry);
     std::vector<std::string> names;
-    for (int row = 1; row < selector.State().Unigrid.RowCount(); ++row)
-      if (selector.State().Unigrid.Row(row).height > 0)
-        names.push_back(selector.State().Unigrid.Row(row).name);
+    for (const GridRow &row : selector.State().Unigrid.rows)
+      if (row.shown)
+        names.push_back(row.name);
     return names;
   };
   EXPECT_EQ(selector.State().Codes, (std::vector<std::string>{"\xC3\x84", "#", "\xC3\x96"}));

@@ -24,7 +24,7 @@ TEST(EawIni, ReadsAndWritesLinesEndedByLineFeedsAlone) {
   game.Write("eaw.ini", "Width=640\nHeight=480\nSound=1\n");
   EXPECT_EQ(Read(game)[1], "480");
   Failures failures;
-  inisave(game.Path(), true, kTexts, failures);
+  inisave(game.Path(), kTexts, failures);
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\nHeight=\r\nSound=1\r\n");
 }
 
@@ -33,7 +33,7 @@ TEST(EawIni, TheLastLineOfAKeyIsShownAndEveryLineOfItRewritten) {
   game.Write("eaw.ini", kIni);
   EXPECT_EQ(Read(game), (Shown{"1024", "600", std::nullopt, "0", "0", "16"}));
   Failures failures;
-  inisave(game.Path(), true, kTexts, failures);
+  inisave(game.Path(), kTexts, failures);
   EXPECT_EQ(game.Read("eaw.ini"), "[Screen]\r\nWidth=1280\r\nHeight=\r\n Width=5\r\nwidth=6\r\n"
                                   "[Game]\r\nDay=12\r\nWidth=1280\r\nMonth=abc\r\n"
                                   "PlaneSetNumber=2\r\n");
@@ -42,16 +42,16 @@ TEST(EawIni, TheLastLineOfAKeyIsShownAndEveryLineOfItRewritten) {
 TEST(EawIni, WritesAReadOnlyFileButNeverDamagesIt) {
   GameFolder game;
   Failures failures;
-  inisave(game.Path(), true, kTexts, failures);
+  inisave(game.Path(), kTexts, failures);
   EXPECT_FALSE(game.Exists("eaw.ini"));
   SetReadOnly(game.Write("eaw.ini", "Width=1\r\n"), true);
-  inisave(game.Path(), true, kTexts, failures);
+  inisave(game.Path(), kTexts, failures);
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\n");
   EXPECT_TRUE(IsWritable(game.Path() / "eaw.ini"));
   EXPECT_TRUE(failures.Empty());
 
   game.Write("eaw.ini.partial/in the way");
-  inisave(game.Path(), true, {"640"}, failures);
+  inisave(game.Path(), {"640"}, failures);
   EXPECT_FALSE(IniEditorSave(game.Path(), "Width=2", failures));
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\n");
   ASSERT_FALSE(failures.Empty());

@@ -39,8 +39,8 @@ TEST_P(FolderLink, IsNamedAndNothingIsWrittenMovedOrChangedThroughIt) {
   game.Write("ZEP128/#Selector/journal.txt", "restore\r\n\r\n");
   const std::map<std::string, std::string> before = Snapshot(outside.Path());
   selector.StartUp(failures);
-  selector.ClickRow(1, failures);
-  selector.ClickRow(1, failures);
+  selector.ClickRow(0, failures);
+  selector.ClickRow(0, failures);
   selector.ResetAll(selector.ResetAllFiles(failures), failures);
   selector.SwitchMusic("Set2", "Set1", failures);
   EXPECT_EQ(Snapshot(outside.Path()), before);
@@ -61,13 +61,13 @@ INSTANTIATE_TEST_SUITE_P(WhereThingsAreKept, FolderLink,
 TEST_F(FolderLink, ACampaignThatBecameALinkIsUnloadedAndItsSavedGamesStay) {
   game.WithCategories("Campaigns: C\r\n").Addon("C-One", {"m.msn"});
   selector.StartUp(failures);
-  selector.ClickRow(1, failures);
+  selector.ClickRow(0, failures);
   game.Write("Savedata/game.sve", "progress");
   fs::rename(game.Path() / "ZEP128/C-One", outside.Path() / "C-One");
   if (!MakeFolderLink(outside.Path() / "C-One", game.Path() / "ZEP128/C-One"))
     GTEST_SKIP() << "this system lets the test make no folder link";
   const std::map<std::string, std::string> before = Snapshot(outside.Path());
-  selector.ClickRow(1, failures);
+  selector.ClickRow(0, failures);
   EXPECT_EQ(Snapshot(outside.Path()), before);
   EXPECT_EQ(game.Read("Savedata/game.sve"), "progress");
   EXPECT_FALSE(game.Exists("Savedata/m.msn"));

@@ -36,7 +36,7 @@ bool RecordingCaption::Showed(const std::string &line) const {
 
 std::vector<std::string> RowNames(const FolderGrid &grid, bool marks) {
   std::vector<std::string> names;
-  for (int row = 1; row < grid.RowCount(); ++row)
+  for (int row = 0; row < grid.RowCount(); ++row)
     names.push_back(grid.Row(row).name + (marks && IsLoaded(grid.Row(row)) ? " [S]" : ""));
   return names;
 }
@@ -45,5 +45,5 @@ int RowOf(const FolderGrid &grid, const std::string &name, int after) {
   for (int row = after + 1; row < grid.RowCount(); ++row)
     if (grid.Row(row).name == name)
       return row;
-  return 0;
+  return -1;
 }

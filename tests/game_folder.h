@@ -65,4 +65,4 @@ public:
 // followed by " [S]".
 std::vector<std::string> RowNames(const FolderGrid &grid, bool marks = false);
 // The first folder row after `after` named `name`, or 0.
-int RowOf(const FolderGrid &grid, const std::string &name, int after = 0);
+int RowOf(const FolderGrid &grid, const std::string &name, int after = -1);

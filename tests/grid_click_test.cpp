@@ -15,12 +15,12 @@ protected:
 
 } // namespace
 
-TEST_F(GridClick, GreenRowUnloadsEnterClicksOtherKeysAndHeaderDoNothing) {
+TEST_F(GridClick, GreenRowUnloadsEnterClicksOtherKeysAndRowsOutsideDoNothing) {
   game.Addon("S-One", {"one.dat"});
   game.WithCategories("Campaigns: C\r\nSounds: N\r\nSkins: S\r\n");
   selector.ClickRow(0, failures); // empty grid
   selector.StartUp(failures);
-  selector.ClickRow(0, failures); // header row
+  selector.ClickRow(-1, failures); // above the first row
   const int row = RowOf(State().Unigrid, "S-One");
   selector.PressKey(row, 'a', failures);
   EXPECT_FALSE(game.Exists("one.dat"));
@@ -29,7 +29,7 @@ TEST_F(GridClick, GreenRowUnloadsEnterClicksOtherKeysAndHeaderDoNothing) {
   EXPECT_EQ(State().Unigrid.currentCol, 1); // coloured in its name column
   Click("S-One");
   EXPECT_FALSE(game.Exists("one.dat"));
-  EXPECT_EQ(Row("S-One").mark, "");
+  EXPECT_FALSE(Row("S-One").loaded);
   EXPECT_EQ(game.Record(), "\r\n");
 }
 
@@ -50,5 +50,5 @@ TEST_F(GridClick, ReplayMarksRowsWithoutTouchingFiles) {
   EXPECT_EQ(game.Record(), record);
   // Each recorded folder has copies in the game, so each shows loaded, two of a letter too.
   for (const char *loaded : {"C-A", "C-B", "S-One", "S-Two"})
-    EXPECT_EQ(Row(loaded).mark, "S") << loaded;
+    EXPECT_TRUE(Row(loaded).loaded) << loaded;
 }

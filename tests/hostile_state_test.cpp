@@ -34,7 +34,7 @@ protected:
   void StartAndUnloadAll() {
     Selector selector(game, caption, starter);
     selector.StartUp(failures);
-    for (int row = 1; row < selector.State().Unigrid.RowCount(); ++row)
+    for (int row = 0; row < selector.State().Unigrid.RowCount(); ++row)
       if (IsLoaded(selector.State().Unigrid.Row(row)))
         selector.ClickRow(row, failures);
     selector.ResetAll(selector.ResetAllFiles(failures), failures);

@@ -33,8 +33,8 @@ TEST(LibraryModel, GridFollowsCategoryLinesThenNames) {
   const SelectorState state = PreparedState(game, failures);
   EXPECT_EQ(RowNames(state.Unigrid), (Lines{"S a", "S-b", "SkinFolder2", "Sunset", "C-camp", "S a",
                                             "S-b", "SkinFolder2", "Sunset", "s-low"}));
-  EXPECT_EQ(state.Unigrid.PathOf(5), game.Path() / "ZEP128" / "C-camp");
-  EXPECT_EQ(state.Unigrid.rows[5].mark, "");
+  EXPECT_EQ(state.Unigrid.PathOf(4), game.Path() / "ZEP128" / "C-camp");
+  EXPECT_FALSE(state.Unigrid.Row(4).loaded);
 }
 
 TEST(LibraryModel, RecordHoldsLoadedNamesInRowOrderAndIsReplayed) {
@@ -45,26 +45,16 @@ TEST(LibraryModel, RecordHoldsLoadedNamesInRowOrderAndIsReplayed) {
   Failures failures;
   SelectorState state = PreparedState(game, failures);
   game.WithRecord("N-c\n\nS-one\r\nGone\r\n\r\n");
-  RecordingCaption caption;
-  ReplayRecord(state, caption, failures);
-  EXPECT_EQ(RowNames(state.Unigrid), (Lines{"S-one", "S-one", "N-a", "N-b", "N-c"}));
-  // Both rows of S-one show it loaded, and the record names it once.
-  for (int row : {1, 2, 5}) {
-    EXPECT_EQ(state.Unigrid.rows[static_cast<size_t>(row)].mark, "S") << row;
-    EXPECT_EQ(state.Unigrid.rows[static_cast<size_t>(row)].nameColour, kLoadedColour) << row;
-  }
-  for (int row : {3, 4})
-    EXPECT_EQ(state.Unigrid.rows[static_cast<size_t>(row)].mark, "") << row;
-
-  state.Ready = false;
-  SaveLoaded(state, failures);
+  ReplayRecord(state, failures);
+  EXPECT_EQ(RowNames(state.Unigrid, true),
+            (Lines{"S-one [S]", "S-one [S]", "N-a", "N-b", "N-c [S]"}));
+  EXPECT_EQ(state.Unigrid.currentRow, 1); // the last recorded row
+  // The replay leaves the record as it was; the record names a folder of two rows once.
   EXPECT_EQ(game.Record(), "N-c\n\nS-one\r\nGone\r\n\r\n");
-  state.Ready = true;
   SaveLoaded(state, failures);
-  EXPECT_TRUE(state.Ready);
   EXPECT_EQ(game.Record(), "S-one\r\nN-c\r\n\r\n");
   for (GridRow &row : state.Unigrid.rows)
-    row.mark.clear();
+    row.loaded = false;
   SaveLoaded(state, failures);
   EXPECT_EQ(game.Record(), "\r\n");
   EXPECT_TRUE(failures.Empty());
@@ -78,7 +68,7 @@ TEST(LibraryModel, UnreadableLibraryFilesAreReportedNotFatal) {
   SelectorState state = PreparedState(game, failures);
   // The built-in categories stand in for the file that cannot be read.
   EXPECT_EQ(state.List3.size(), 29u);
-  EXPECT_EQ(state.Unigrid.RowCount(), 2);
+  EXPECT_EQ(state.Unigrid.RowCount(), 1);
   ASSERT_FALSE(failures.Empty());
   EXPECT_NE(failures.Message("").find("zep.ini"), std::string::npos);
 }
@@ -91,10 +81,9 @@ TEST(LibraryModel, LibraryFilesAreFoundWhateverTheirCase) {
   Failures failures;
   SelectorState state = PreparedState(game, failures);
   EnsureRecord(state, failures);
-  RecordingCaption caption;
-  ReplayRecord(state, caption, failures);
+  ReplayRecord(state, failures);
   EXPECT_EQ(state.List3.size(), 3u);
-  EXPECT_EQ(state.Unigrid.rows[1].mark, "S");
+  EXPECT_TRUE(state.Unigrid.Row(0).loaded);
   EXPECT_EQ(ListFiles(game.Path() / "zep128"), (Lines{"foldersloaded.TXT", "ZEP.INI"}));
   EXPECT_EQ(ListFolders(game.Path()).size(), 1u);
 }

@@ -44,7 +44,7 @@ TEST_F(Links, TemporaryNamesPlantedAsLinksAreNeverWrittenThrough) {
     game.MakeFolder("ZEP128/#Selector");
     ASSERT_TRUE(Plant(name)) << name;
   }
-  selector.ClickRow(1, failures);
+  selector.ClickRow(0, failures);
   selector.SaveSettings({"1024"}, failures);
   EXPECT_TRUE(selector.SwitchMusic("Set2", "Set1", failures));
   fs::remove(game.Path() / "ZEP128/zep.ini");
@@ -63,7 +63,7 @@ TEST_F(Links, LinkedFilesAreRefusedAndWhatTheyPointAtStaysAsItWas) {
   ASSERT_TRUE(Plant("ZEP128/S-One/linked.dat"));
   fs::remove(game.Path() / "eaw.ini");
   ASSERT_TRUE(Plant("eaw.ini"));
-  selector.ClickRow(1, failures);
+  selector.ClickRow(0, failures);
   selector.SaveSettings({"1024"}, failures);
   EXPECT_FALSE(selector.SaveSettingsFile("Width=1", failures));
   EXPECT_FALSE(game.Exists("linked.dat"));
@@ -92,7 +92,7 @@ TEST_F(Links, APlaceForTheGamesOwnFileTakenByALinkLoopLeavesThatFileAlone) {
   game.Write("planes.dat", "own");
   game.MakeFolder("ZEP128/#Selector/originals/G");
   fs::create_symlink("planes.dat", game.Path() / "ZEP128/#Selector/originals/G/planes.dat");
-  selector.ClickRow(1, failures);
+  selector.ClickRow(0, failures);
   EXPECT_EQ(game.Read("planes.dat"), "own");
   EXPECT_NE(failures.Message("").find("planes.dat"), std::string::npos);
 }

@@ -12,14 +12,13 @@ namespace fs = std::filesystem;
 
 namespace {
 
-// A game folder and a ready library state that loads and unloads its add-on folders.
+// A game folder and a library state that loads and unloads its add-on folders.
 struct Game {
   GameFolder folder;
   LibraryState state = LibraryFor(folder.Path());
   RecordingCaption caption;
   Failures failures;
 
-  Game() { state.Ready = true; }
   void Load(const std::string &name) { MoveIn(state, folder.Addon(name), caption, failures); }
   void Unload(const std::string &name) { MoveOut(state, folder.Addon(name), caption, failures); }
   // Unloads a folder recorded loaded before the ledger was kept, as after the first start.
@@ -64,15 +63,6 @@ TEST(MoveIn, PutsEachFileWhereTheGameLooksForIt) {
   EXPECT_EQ(game.caption.progress.back(), std::make_pair(5, 5));
   EXPECT_EQ(game.caption.text, "Selector");
   EXPECT_TRUE(game.failures.Empty());
-}
-
-TEST(MoveIn, CopiesNothingWhileNotReady) {
-  Game game;
-  game.folder.Write("ZEP128/S-One/one.dat");
-  game.state.Ready = false;
-  game.Load("S-One");
-  EXPECT_FALSE(game.folder.Exists("one.dat"));
-  EXPECT_TRUE(game.caption.shown.empty());
 }
 
 TEST(MoveIn, FileThatCannotBeCopiedIsSkippedAndReported) {

@@ -11,10 +11,12 @@ TEST(Preview, RebuiltOnlyWhenThePointerEntersAnotherRow) {
   RecordingCaption caption;
   NotingStarter starter;
   Selector selector(game.Path(), caption, starter);
-  EXPECT_TRUE(selector.HoverRow(3));
-  EXPECT_FALSE(selector.HoverRow(3));
-  EXPECT_TRUE(selector.HoverRow(0));
-  EXPECT_TRUE(selector.HoverRow(3));
+  EXPECT_TRUE(selector.HoverRow(2));
+  EXPECT_FALSE(selector.HoverRow(2));
+  EXPECT_TRUE(selector.HoverRow(-1)); // the header
+  EXPECT_TRUE(selector.HoverRow(2));
+  selector.LeaveGrid();
+  EXPECT_TRUE(selector.HoverRow(-1));
 }
 
 TEST(Preview, DescriptionAndFirstPictureInNameOrder) {
@@ -36,9 +38,9 @@ TEST(Preview, HeaderRowRemovedFolderAndUnreadableDescriptionGiveAnEmptyPreview) 
   LibraryState state;
   state.Unigrid.library = lib.Path();
   for (const char *name : {"S-Gone", "S-Locked"})
-    state.Unigrid.rows.push_back(GridRow{name, "", 0, kRowHeight});
+    state.Unigrid.rows.push_back(GridRow{name});
   lib.MakeFolder("S-Locked/contents.txt/not-a-file");
-  for (int row : {-1, 0, 1, 2, 3}) {
+  for (int row : {-1, 0, 1, 2}) {
     const FolderPreview preview = PreviewOfRow(state, row);
     EXPECT_EQ(preview.description, "") << row;
     EXPECT_TRUE(preview.picture.empty()) << row;

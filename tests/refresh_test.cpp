@@ -30,20 +30,18 @@ TEST_F(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   game.MakeFolder("ZEP128/F-Hurri");
   game.MakeFolder("ZEP128/S-Desert");
   selector.ShowCategory(2);
-  selector.HoverRow(2);
+  selector.HoverRow(1);
   selector.RefreshLibrary(failures);
 
   EXPECT_EQ(RowNames(state.Unigrid, true),
             (Names{"F-Hurri", "S-Camo [S]", "S-Desert", "G-Sky [S]"}));
-  EXPECT_EQ(state.Unigrid.rows[2].nameColour, kLoadedColour);
   // The category shown before is shown again, with its header.
-  for (int row = 1; row < state.Unigrid.RowCount(); ++row)
-    EXPECT_EQ(state.Unigrid.Row(row).height, row == 2 || row == 3 ? kRowHeight : 0) << row;
-  EXPECT_EQ(state.Unigrid.Row(0).name, "Only one selection can be made!");
+  for (int row = 0; row < state.Unigrid.RowCount(); ++row)
+    EXPECT_EQ(state.Unigrid.Row(row).shown, row == 1 || row == 2) << row;
+  EXPECT_EQ(state.Unigrid.rule, "Only one selection can be made!");
   EXPECT_EQ(state.summary, "Refresh: 4 folders, 2 new, 1 gone");
   EXPECT_EQ(state.Codes, (Names{"S"}));
-  EXPECT_EQ(state.hoveredRow, -1);
-  EXPECT_TRUE(state.Ready);
+  EXPECT_FALSE(state.hoveredRow);
   EXPECT_EQ(ListFiles(game.Path()), (Names{"planes.dat"}));
   EXPECT_EQ(game.Read("planes.dat"), "planes");
   EXPECT_EQ(game.Record(), "S-Camo\r\nG-Sky\r\n\r\n");

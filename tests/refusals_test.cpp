@@ -40,7 +40,7 @@ TEST_F(Refusals, NamesOfTheLongestLengthAreLoaded) {
   game.WithCategories("Skins: S\r\n");
   game.Write("ZEP128/S-Long/" + name, "long");
   selector.StartUp(failures);
-  selector.ClickRow(1, failures);
+  selector.ClickRow(0, failures);
   EXPECT_EQ(game.Read(name), "long");
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
@@ -67,12 +67,11 @@ TEST(Reasons, AFullDiskAHeldFileAndNamesWindowsCannotKeepAreCalledSo) {
   GameFolder game;
   game.WithCategories("Skins: S\r\n");
   LibraryState state = LibraryFor(game.Path());
-  state.Ready = true;
   state.Unigrid.library = state.LibDir;
-  state.Unigrid.rows.push_back(GridRow{"S-odd.", "", 0, kRowHeight});
+  state.Unigrid.rows.push_back(GridRow{"S-odd."});
   RecordingCaption caption;
   Failures failures;
-  library::ClickRow(state, 1, caption, failures);
+  library::ClickRow(state, 0, caption, failures);
   ASSERT_EQ(failures.Lines().size(), 1u);
   EXPECT_NE(failures.Lines()[0].find("cannot be loaded: it has " + dotted), std::string::npos);
 }

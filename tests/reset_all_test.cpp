@@ -34,12 +34,10 @@ protected:
 } // namespace
 
 TEST_F(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
-  state.GridBackColor = 0xFFFFFF;
   BuildGrid(state, LibraryCategories(state.LibDir, failures).codes);
-  ReplayRecord(state, caption, failures);
-  ASSERT_EQ(state.Unigrid.rows[1].mark, "S");
+  ReplayRecord(state, failures);
+  ASSERT_TRUE(state.Unigrid.Row(0).loaded);
   state.Slots.frameVisible = true;
-  state.Ready = false;
 
   for (int time = 0; time < 2; ++time) {
     ::ResetAll(state, CleanUpNames(state, failures), caption, failures);
@@ -52,9 +50,7 @@ TEST_F(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
   }
   EXPECT_EQ(caption.shown.front(), "Please wait... cleaning up");
   EXPECT_EQ(caption.text, "Selector");
-  EXPECT_TRUE(state.Ready);
-  EXPECT_EQ(state.Unigrid.rows[1].mark, "");
-  EXPECT_EQ(state.Unigrid.rows[1].nameColour, 0xFFFFFFu);
+  EXPECT_FALSE(state.Unigrid.Row(0).loaded);
   EXPECT_FALSE(state.Slots.frameVisible);
   EXPECT_TRUE(failures.Empty());
 }

@@ -13,7 +13,7 @@ inline std::string ClickFolder(Selector &selector, const std::string &folder, Fa
 // The mark of the first grid row named `folder`: "S" when loaded.
 inline std::string MarkOf(const Selector &selector, const std::string &folder) {
   const FolderGrid &grid = selector.State().Unigrid;
-  return grid.Row(RowOf(grid, folder)).mark;
+  return IsLoaded(grid.Row(RowOf(grid, folder))) ? "S" : "";
 }
 
 // A Selector on a fresh game folder, for tests that drive the program's verbs.

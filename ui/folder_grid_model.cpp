@@ -3,13 +3,26 @@
 #include "platform/qt_paths.h"
 #include "ui/twips.h"
 
+#include <algorithm>
+
 #include <QFont>
+
+namespace {
+
+// The name cell of a loaded row.
+const QColor kLoadedColour(192, 255, 192);
+// The mark column's text for a loaded row.
+constexpr char kLoadedMark[] = "S";
+// Height in twips of a shown row and of the header.
+constexpr int kRowHeightTwips = 240;
+
+} // namespace
 
 FolderGridModel::FolderGridModel(const FolderGrid &grid, QObject *parent)
     : QAbstractTableModel(parent), grid_(grid) {}
 
 int FolderGridModel::rowCount(const QModelIndex &parent) const {
-  return parent.isValid() ? 0 : grid_.RowCount() - 1;
+  return parent.isValid() ? 0 : grid_.RowCount();
 }
 
 int FolderGridModel::columnCount(const QModelIndex &parent) const {
@@ -19,21 +32,21 @@ int FolderGridModel::columnCount(const QModelIndex &parent) const {
 QVariant FolderGridModel::data(const QModelIndex &index, int role) const {
   if (!index.isValid())
     return {};
-  const GridRow &row = grid_.rows[static_cast<size_t>(index.row() + 1)];
+  const GridRow &row = grid_.Row(index.row());
   if (role == Qt::DisplayRole) {
     switch (index.column()) {
     case 0:
-      return FromPath(grid_.PathOf(index.row() + 1));
+      return FromPath(grid_.PathOf(index.row()));
     case 1:
       return FromName(row.name);
     default:
-      return QString::fromStdString(row.mark);
+      return IsLoaded(row) ? QString(kLoadedMark) : QString();
     }
   }
   if (index.column() != 1)
     return {};
-  if (role == Qt::BackgroundRole && row.nameColour != 0)
-    return FromOle(row.nameColour);
+  if (role == Qt::BackgroundRole && IsLoaded(row))
+    return kLoadedColour;
   // A name too long for its column is read whole in the tooltip.
   if (role == Qt::ToolTipRole)
     return FromName(row.name);
@@ -49,7 +62,7 @@ QVariant FolderGridModel::data(const QModelIndex &index, int role) const {
 QVariant FolderGridModel::headerData(int section, Qt::Orientation orientation, int role) const {
   if (orientation != Qt::Horizontal || role != Qt::DisplayRole)
     return {};
-  return section == 1 ? FromName(grid_.rows[0].name) : QString();
+  return section == 1 ? FromName(grid_.rule) : QString();
 }
 
 void FolderGridModel::Rebuilt() {
@@ -61,4 +74,14 @@ void FolderGridModel::Changed() {
   if (rowCount() > 0)
     emit dataChanged(index(0, 0), index(rowCount() - 1, columnCount() - 1));
   emit headerDataChanged(Qt::Horizontal, 1, 1);
+}
+
+void FolderGridModel::ShowRows(QTableView &view) const {
+  for (int row = 0; row < grid_.RowCount(); ++row)
+    if (view.isRowHidden(row) == grid_.Row(row).shown)
+      view.setRowHidden(row, !grid_.Row(row).shown);
+}
+
+int FolderGridModel::ViewHeight() const {
+  return TwipsToPixels(kRowHeightTwips * (std::min(grid_.RowCount(), 19) + 1) + 72);
 }

@@ -80,12 +80,12 @@ void MainWindow::WireHooks() {
     const int y = static_cast<QMouseEvent *>(event)->position().toPoint().y();
     const int row = c_.Unigrid->rowAt(y);
     if (row >= 0)
-      Unigrid_MouseMove(row + 1);
+      Unigrid_MouseMove(row);
     return false;
   });
   OnEvents(c_.Unigrid->horizontalHeader(), [this](QEvent *event) {
     if (event->type() == QEvent::MouseMove)
-      Unigrid_MouseMove(0);
+      Unigrid_MouseMove(-1);
     return false;
   });
   OnEvents(c_.Unigrid, [this](QEvent *event) {
@@ -208,7 +208,7 @@ void MainWindow::Unigrid_Click(const QModelIndex &index) {
   std::string notice;
   {
     const InputBlocker blocker;
-    notice = selector_.ClickRow(index.row() + 1, failures);
+    notice = selector_.ClickRow(index.row(), failures);
   }
   ShowSummary();
   ShowGridChanges();
@@ -224,7 +224,7 @@ void MainWindow::Unigrid_KeyPress(int key) {
   std::string notice;
   {
     const InputBlocker blocker;
-    notice = selector_.PressKey(current.row() + 1, key, failures);
+    notice = selector_.PressKey(current.row(), key, failures);
   }
   ShowSummary();
   ShowGridChanges();
@@ -239,17 +239,17 @@ void MainWindow::Unigrid_Type(const QString &text) {
     typed_.clear();
   typedSince_.restart();
   typed_ += text;
-  const int current = c_.Unigrid->currentIndex().row() + 1;
+  const int current = c_.Unigrid->currentIndex().row();
   const int row = selector_.FindRow(typed_.size() == 1 ? current + 1 : current, ToName(typed_));
-  if (row > 0)
-    c_.Unigrid->setCurrentIndex(gridModel_->index(row - 1, 1));
+  if (row >= 0)
+    c_.Unigrid->setCurrentIndex(gridModel_->index(row, 1));
 }
 
 void MainWindow::Unigrid_MouseMove(int row) {
   const std::optional<FolderPreview> preview = selector_.HoverRow(row);
   if (!preview)
     return;
-  c_.SlotFrame->setVisible(State().Slots.frameVisible && row < 1);
+  c_.SlotFrame->setVisible(State().Slots.frameVisible && row < 0);
   c_.MyLabel->clear();
   c_.Text9->clear();
   ShowPicture(c_.MyImage, State().BackPic);
@@ -387,22 +387,17 @@ void MainWindow::ShowGridRows() {
   // height is added so that it covers no row.
   const int scrollBar = grid->style()->pixelMetric(QStyle::PM_ScrollBarExtent);
   const QRect place = grid->geometry();
-  grid->setGeometry(place.x(), place.y(), place.width(),
-                    TwipsToPixels(GridHeightTwips(State().Unigrid.RowCount())) + scrollBar);
+  grid->setGeometry(place.x(), place.y(), place.width(), gridModel_->ViewHeight() + scrollBar);
 }
 
 void MainWindow::ShowGridChanges() {
   QTableView *grid = c_.Unigrid;
   const FolderGrid &rows = State().Unigrid;
   grid->setUpdatesEnabled(false);
-  for (int row = 1; row < rows.RowCount(); ++row) {
-    const bool hidden = rows.Row(row).height == 0;
-    if (grid->isRowHidden(row - 1) != hidden)
-      grid->setRowHidden(row - 1, hidden);
-  }
+  gridModel_->ShowRows(*grid);
   gridModel_->Changed();
-  if (rows.currentRow >= 1)
-    grid->setCurrentIndex(gridModel_->index(rows.currentRow - 1, rows.currentCol));
+  if (rows.currentRow >= 0)
+    grid->setCurrentIndex(gridModel_->index(rows.currentRow, rows.currentCol));
   grid->setUpdatesEnabled(true);
   ShowSlotPanel();
 }

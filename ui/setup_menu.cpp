@@ -46,7 +46,7 @@ SetupMenu::SetupMenu(Selector &selector, QTableView *grid, QWidget *window)
     if (event->type() != QEvent::ContextMenu)
       return false;
     auto *menu = static_cast<QContextMenuEvent *>(event);
-    Open(grid_->rowAt(menu->pos().y()) + 1, menu->globalPos());
+    Open(grid_->rowAt(menu->pos().y()), menu->globalPos());
     return true;
   });
   OnEvents(grid_, [this](QEvent *event) {
@@ -54,7 +54,7 @@ SetupMenu::SetupMenu(Selector &selector, QTableView *grid, QWidget *window)
       return false;
     const QModelIndex current = grid_->currentIndex();
     const QRect place = current.isValid() ? grid_->visualRect(current) : grid_->viewport()->rect();
-    Open(current.isValid() ? current.row() + 1 : 0, grid_->viewport()->mapToGlobal(place.center()));
+    Open(current.isValid() ? current.row() : -1, grid_->viewport()->mapToGlobal(place.center()));
     return true;
   });
 }
@@ -64,7 +64,7 @@ void SetupMenu::Open(int row, QPoint global) {
   menu->setObjectName("FolderGridMenu");
   menu->setAttribute(Qt::WA_DeleteOnClose);
   QAction *files = menu->addAction("Files of this folder…", this, [this, row] { ShowFiles(row); });
-  files->setEnabled(row >= 1 && grid_->model() && row <= grid_->model()->rowCount());
+  files->setEnabled(row >= 0 && grid_->model() && row < grid_->model()->rowCount());
   menu->addSeparator();
   AddSetupEntries(menu);
   menu->addSeparator();

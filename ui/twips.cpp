@@ -10,8 +10,3 @@ QRect Twips(int left, int top, int width, int height) {
   return QRect(TwipsToPixels(left), TwipsToPixels(top), TwipsToPixels(width),
                TwipsToPixels(height));
 }
-
-QColor FromOle(std::uint32_t ole) {
-  return QColor(static_cast<int>(ole & 0xFF), static_cast<int>((ole >> 8) & 0xFF),
-                static_cast<int>((ole >> 16) & 0xFF));
-}

@@ -1,8 +1,6 @@
 #pragma once
 
-#include <QColor>
 #include <QRect>
-#include <cstdint>
 
 // Twips per pixel, the fixed conversion the window's layout uses.
 inline constexpr int kTwipsPerPixel = 15;
@@ -11,5 +9,3 @@ inline constexpr int kTwipsPerPixel = 15;
 QRect Twips(int left, int top, int width, int height);
 // Twips in pixels.
 int TwipsToPixels(int twips);
-// An OLE colour (&HBBGGRR) as a Qt colour.
-QColor FromOle(std::uint32_t ole);
