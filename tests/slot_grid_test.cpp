@@ -3,6 +3,7 @@
 #include "base/text_file.h"
 #include "library/grid_builder.h"
 #include "library/grid_click.h"
+#include "library/record_replay.h"
 #include "slots/leading_number.h"
 #include "slots/plane_set.h"
 #include "tests/game_folder.h"
@@ -59,6 +60,12 @@ TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
   library::ClickRow(state, 1, caption, failures); // unload F-Plain
   EXPECT_TRUE(state.Slots.rows.empty());
   EXPECT_FALSE(state.Slots.frameVisible);
+
+  game.WithRecord("F-Plain\r\nF-Pack\r\n"); // at start-up, the last one recorded shows
+  ReplayRecord(state, failures);
+  EXPECT_TRUE(state.Slots.frameVisible);
+  EXPECT_EQ(state.Slots.label, "F-Pack: a.zep");
+  EXPECT_EQ(RowNames(state.Unigrid, true), (std::vector<std::string>{"F-Pack [S]", "F-Plain [S]"}));
   EXPECT_TRUE(failures.Empty());
 }
 
