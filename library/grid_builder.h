@@ -12,6 +12,6 @@
 bool IsReservedFolder(std::string_view name);
 // Replaces the grid's folder rows: for each category letter in file order, every folder of
 // `folderNames` (the subfolders of `library`, in name order) whose name starts with that letter.
-// The header row stays.
+// The rule text stays.
 void BuildFolderRows(FolderGrid &grid, const std::vector<std::string> &codes,
                      const std::filesystem::path &library, std::vector<std::string> folderNames);

@@ -17,5 +17,5 @@ inline constexpr char kPicturePatterns[] = "mypic;skinpic;*.jpg;*.bmp;*.gif";
 // The preview of add-on folder `folder`. A missing folder, or a contents.txt that cannot be read,
 // gives an empty description and no picture; a contents.txt too large to read says so instead.
 FolderPreview PreviewOf(const std::filesystem::path &folder);
-// The preview of grid row `row`; the header row and rows outside the grid give an empty preview.
+// The preview of grid row `row`; a row outside the grid (the header is -1) gives an empty preview.
 FolderPreview PreviewOfRow(const LibraryState &state, int row);
