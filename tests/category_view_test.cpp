@@ -31,3 +31,17 @@ TEST_F(CategoryView, LettersBeyondAsciiListTheirFoldersAndNoLetterListsTheProgra
   EXPECT_EQ(shown(3), std::vector<std::string>{"#-mine"});
   EXPECT_EQ(shown(4), std::vector<std::string>{"\xC3\x96-other"});
 }
+
+// Typing goes to the next shown row from the one given, round past the end, in any letter case.
+TEST(FolderGrid, FindShownRowStartsAtTheRowGivenAndSkipsHiddenRows) {
+  FolderGrid grid;
+  EXPECT_EQ(grid.FindShownRow(0, "S"), -1);
+  for (const char *name : {"S-alpha", "N-bravo", "s-beta"})
+    grid.rows.push_back(GridRow{name});
+  grid.Row(1).shown = false;
+  EXPECT_EQ(grid.FindShownRow(0, "s"), 0);
+  EXPECT_EQ(grid.FindShownRow(1, "S-"), 2);
+  EXPECT_EQ(grid.FindShownRow(3, "s-a"), 0);
+  EXPECT_EQ(grid.FindShownRow(-1, "S"), 2);
+  EXPECT_EQ(grid.FindShownRow(0, "N"), -1);
+}
