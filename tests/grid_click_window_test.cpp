@@ -1,8 +1,6 @@
 #include "tests/game_folder.h"
 #include "tests/window_driver.h"
 
-#include <QApplication>
-#include <QMessageBox>
 #include <QTableWidget>
 #include <QTest>
 #include <gtest/gtest.h>
@@ -59,25 +57,4 @@ TEST(GridClickWindow, FlightModelShowsItsPlaneSetsUntilUnloaded) {
   EXPECT_TRUE(panel->isVisible());
   driver.ClickRow(2);
   EXPECT_FALSE(panel->isVisible());
-}
-
-TEST(GridClickWindow, CopiesThatFailAreSkippedAndToldInOneBox) {
-  GameFolder game;
-  game.WithGameFolders().WithCategories("Singles: Q\r\n");
-  game.Addon("Q-Big", {"a.dat"});
-  for (int i = 10; i < 30; ++i) {
-    const std::string name = "f" + std::to_string(i) + ".dat";
-    game.Write("ZEP128/Q-Big/" + name);
-    game.MakeFolder(name + "/in-the-way");
-  }
-  WindowDriver driver(game.Path());
-  driver.ClickRow(1);
-  QApplication::processEvents();
-  EXPECT_EQ(driver.Mark(1), "S");
-  const QList<QMessageBox *> boxes = driver.Window().findChildren<QMessageBox *>();
-  ASSERT_EQ(boxes.size(), 1);
-  EXPECT_TRUE(boxes[0]->text().contains("f21.dat"));
-  EXPECT_FALSE(boxes[0]->text().contains("f22.dat"));
-  EXPECT_TRUE(boxes[0]->text().endsWith("... and 8 more."));
-  EXPECT_TRUE(boxes[0]->detailedText().contains("f29.dat"));
 }

@@ -49,23 +49,34 @@ TEST(SettingsWindow, BoxesShowTheFileAndEnterSavesThemOrSaysWhyNot) {
   EXPECT_TRUE(messages[0].contains("eaw.ini"));
 }
 
-TEST(SettingsWindow, EditorShowsSavesAndHides) {
+TEST(SettingsWindow, EditorShowsFollowsTheBoxesAsksBeforeSavingOverAChangeAndHides) {
   GameFolder game;
-  game.Write("eaw.ini", "[Screen]\r\nWidth=800\r\n");
+  game.Write("eaw.ini", "Width=800\r\nHeight=600\r\n");
   WindowDriver driver(game.Path());
   auto *editor = driver.Find<QWidget>("Frame21");
   driver.Find<QTabWidget>("SSTab1")->setCurrentIndex(0);
   QTest::mouseClick(driver.Find<QPushButton>("IniEdit"), Qt::LeftButton);
   EXPECT_TRUE(editor->isVisible());
   auto *text = driver.Find<QPlainTextEdit>("Text14");
-  EXPECT_EQ(text->toPlainText(), "[Screen]\nWidth=800\n");
+  EXPECT_EQ(text->toPlainText(), "Width=800\nHeight=600\n");
   // The editor has the style's own colours, not the window's teal.
   const QPalette standard = QApplication::style()->standardPalette();
   EXPECT_EQ(editor->palette().color(QPalette::Window), standard.color(QPalette::Window));
   EXPECT_EQ(text->palette().color(QPalette::Base), standard.color(QPalette::Base));
+  PressEnterIn(driver, "Text5", "1024");
+  EXPECT_EQ(text->toPlainText(), "Width=1024\nHeight=600\n");
 
-  text->setPlainText("Width=1280\n");
-  QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
+  text->setPlainText("Width=1280\nHeight=600\nExtra=1\n");
+  PressEnterIn(driver, "Text6", "768");
+  EXPECT_EQ(text->toPlainText(), "Width=1280\nHeight=600\nExtra=1\n");
+  auto *save = driver.Find<QPushButton>("InSaver");
+  EXPECT_EQ(
+      driver.AnswerNextBox(QMessageBox::Cancel, [&] { QTest::mouseClick(save, Qt::LeftButton); }),
+      "eaw.ini has changed since the editor showed it (Height). Save the editor's text over "
+      "it?");
+  EXPECT_EQ(game.Read("eaw.ini"), "Width=1024\r\nHeight=768\r\n");
+  driver.AnswerNextBox(QMessageBox::Ok, [&] { QTest::mouseClick(save, Qt::LeftButton); });
+  EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\nHeight=600\r\nExtra=1\r\n\r\n");
   EXPECT_EQ(driver.Find<QLineEdit>("Text5")->text(), "1280");
   EXPECT_EQ(driver.Summary(), "eaw.ini saved");
   QTest::mouseClick(editor, Qt::LeftButton, {}, QPoint(editor->width() - 5, editor->height() - 5));
@@ -122,7 +133,7 @@ TEST(SettingsWindow, MusicSetNamesThatAreNotTextKeepTheirBytes) {
 }
 #endif
 
-TEST(SettingsWindow, FlyStartsTheGameEachTimeOrSaysWhyNot) {
+TEST(SettingsWindow, FlyStartsTheGameEachTimeOrSaysWhyNotAndTellsAQuickFailureOnce) {
   GameFolder game;
   WindowDriver driver(game.Path());
   auto *fly = driver.Find<QPushButton>("delmsn");
@@ -138,6 +149,15 @@ TEST(SettingsWindow, FlyStartsTheGameEachTimeOrSaysWhyNot) {
   EXPECT_TRUE(QTest::qWaitFor([&] { return StartedCount(game.Path()) == 2; }, 5000));
   EXPECT_EQ(driver.Summary(), "Game started");
   EXPECT_TRUE(driver.Window().isVisible());
+  EXPECT_TRUE(driver.TakeMessages().isEmpty());
+
+  MakeStandInGame(game, 3);
+  QTest::mouseClick(fly, Qt::LeftButton);
+  QStringList failed;
+  EXPECT_TRUE(QTest::qWaitFor([&] { return !(failed = driver.TakeMessages()).isEmpty(); }));
+  ASSERT_EQ(failed.size(), 1);
+  EXPECT_TRUE(failed[0].contains("status 3")) << failed[0].toStdString();
+  QTest::qWait(300);
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 }
 

@@ -4,7 +4,6 @@
 #include "library/grid_builder.h"
 #include "library/grid_click.h"
 #include "library/record_replay.h"
-#include "slots/leading_number.h"
 #include "slots/plane_set.h"
 #include "tests/game_folder.h"
 
@@ -72,16 +71,9 @@ TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
 TEST(SlotGrid, SkinCodeTakesOnlyCharacterCodesThatExist) {
   TestFolder folder;
   folder.Write("P-Short/a.zep", Description("Short", "1", {"112", "51"}));
-  folder.Write("P-Odd/a.zep", Description("Odd", "1", {" 112.9", "300", "-1", "x"}));
+  folder.Write("P-Odd/a.zep",
+               Description("Odd", "1", {"\t 112.9", "99999999999999999999999999", "-1", "x"}));
   Failures failures;
   EXPECT_EQ(ReadPlaneSet(folder.Path() / "P-Short", failures).skinSlot, "P3");
   EXPECT_EQ(ReadPlaneSet(folder.Path() / "P-Odd", failures).skinSlot, std::string("P\0", 2));
-}
-
-TEST(SlotGrid, LeadingWholeNumber) {
-  EXPECT_EQ(LeadingWholeNumber("104"), 104);
-  EXPECT_EQ(LeadingWholeNumber("\t 56.99 rest"), 56);
-  EXPECT_EQ(LeadingWholeNumber("-3"), -3);
-  EXPECT_EQ(LeadingWholeNumber("abc"), 0);
-  EXPECT_GT(LeadingWholeNumber("99999999999999999999999999"), 255);
 }

@@ -1,4 +1,3 @@
-#include "base/existence.h"
 #include "base/file_ops.h"
 #include "base/listing.h"
 #include "base/text_file.h"
@@ -49,16 +48,6 @@ TEST(Copy, OnlyANewNameIsWrittenWithoutTheTemporaryFile) {
   EXPECT_EQ(folder.Read("kept.dat"), "old");
   EXPECT_EQ(folder.Read("listed.dat"), "old");
   EXPECT_EQ(failures.Lines().size(), 2u);
-}
-
-TEST(Existence, FilesAndFoldersAreToldApart) {
-  TestFolder folder;
-  const fs::path file = folder.Write("eaw.ini");
-  EXPECT_FALSE(FolderCheck(file));
-  EXPECT_FALSE(FileCheck(folder.Path()));
-  EXPECT_TRUE(FileCheck(file));
-  EXPECT_FALSE(FileCheck(folder.Path() / "missing"));
-  EXPECT_TRUE(FolderCheck(folder.Path()));
 }
 
 TEST(Listing, PatternsMatchLikeWindowsIgnoringCase) {

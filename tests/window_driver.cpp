@@ -60,7 +60,7 @@ void MakeStandInGame(GameFolder &game, int status) {
   namespace fs = std::filesystem;
 #ifdef _WIN32
   fs::copy_file(ToPath(QCoreApplication::applicationDirPath()) / "stand_in_game.exe",
-                game.Path() / "eaw.exe");
+                game.Path() / "eaw.exe", fs::copy_options::overwrite_existing);
   game.Write("exit-status", std::to_string(status));
 #else
   const fs::path exe =
