@@ -14,5 +14,4 @@ struct SelectorState : LibraryState {
   std::filesystem::path NewPic;   // the General Settings page's picture; empty for none
   int hoveredRow = -1;            // the grid row whose preview is shown; -1 for none
   int shownCategory = 0;          // the category list entry the grid shows
-  std::string summary;            // the line that sums up the last action; empty for none
 };

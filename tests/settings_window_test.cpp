@@ -47,6 +47,7 @@ TEST(SettingsWindow, BoxesShowTheFileAndEnterSavesThemOrSaysWhyNot) {
   const QStringList messages = driver.TakeMessages();
   ASSERT_EQ(messages.size(), 1);
   EXPECT_TRUE(messages[0].contains("eaw.ini"));
+  EXPECT_EQ(driver.Summary(), kInstructions); // the line of the save before is gone
 }
 
 TEST(SettingsWindow, EditorShowsSavesAndHides) {
