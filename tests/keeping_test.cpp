@@ -147,10 +147,9 @@ TEST_F(Keeping, AFolderGoneFromTheLibraryOrPartlyLoadedIsSaidSo) {
   ASSERT_EQ(failures.Lines().size(), 1u);
   EXPECT_NE(failures.Lines()[0].find("is no longer in the library"), std::string::npos);
 
-  Failures partly;
   game.MakeFolder("sky.spt.partial/in the way");
   game.MakeFolder("sky.spt/in the way");
-  ClickFolder(*selector, "N-B", partly);
+  const Failures partly = Click("N-B").failures;
   EXPECT_EQ(Mark("N-B"), "S");
   EXPECT_EQ(partly.Lines().size(), 1u);
   EXPECT_EQ(partly.HeadingOr("").find("\"N-B\" is only partly loaded"), 0u);
@@ -181,8 +180,7 @@ TEST_F(Keeping, ACopyThatCannotBeDeletedStaysListedIsTriedAgainAndIsNoOriginal) 
     // The game holds sky.spt open; here something that cannot be deleted takes its place.
     fs::remove(game.Path() / "sky.spt");
     game.Write("sky.spt/held");
-    Failures held;
-    ClickFolder(*selector, "N-C", held);
+    const Failures held = Click("N-C").failures;
     EXPECT_NE(held.Message("").find("sky.spt"), std::string::npos);
     fs::remove_all(game.Path() / "sky.spt");
     game.Write("sky.spt", "N-C"); // released

@@ -47,9 +47,8 @@ TEST_F(Setups, SaveKeepsLoadOrderAndSwitchingKeepsTheRulesAndGoesBack) {
              "\xEF\xBB\xBFS-a\r\nN-x  \r\n\r\nN-Gone\nS-b\r\nC-one\r\nN-y");
   EXPECT_EQ(selector.Setups(), (Names{"hand", "Mine"}));
   const Outcome switched = Gather(selector.SwitchToSetup("hand"));
-  EXPECT_EQ(switched.notice,
-            "Only one folder of letter \"S\" can be loaded: \"S-b\" was loaded, not "
-            "\"S-a\".");
+  EXPECT_EQ(switched.notice, "Only one folder of letter \"S\" can be loaded: \"S-b\" was "
+                             "loaded, not \"S-a\".");
   ASSERT_EQ(failures.Lines(), Names{"\"N-Gone\" is not in the library, so it was not loaded"});
   // N-y was loaded before N-x, against the setup's order: it goes and comes back after it.
   EXPECT_EQ(Loaded(), (Names{"N-x", "S-b", "C-one", "N-y"}));
