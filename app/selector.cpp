@@ -26,7 +26,9 @@ Selector::Selector(const fs::path &eawDir, Caption &caption, ProgramStarter &sta
   static_cast<LibraryState &>(state_) = LibraryFor(eawDir);
 }
 
-void Selector::StartUp(Failures &failures) {
+Outcome Selector::StartUp() {
+  Outcome outcome;
+  Failures &failures = outcome.failures;
   FinishMusicSwitch(state_.EAWDir, MusicJournal(), failures);
   FinishInterrupted(state_, caption_, failures);
   RemovePartial(PartialPath(IniPath(state_.EAWDir)));
@@ -42,6 +44,7 @@ void Selector::StartUp(Failures &failures) {
   if (!skipped.empty())
     for (const std::string &line : SkippedLinesMessage(skipped))
       failures.Add(line);
+  return outcome;
 }
 
 std::string Selector::ShowCategory(int entry) {
@@ -89,24 +92,28 @@ static std::string TallyText(const Tally &tally) {
   return text.empty() ? "no file changed" : text;
 }
 
-std::string Selector::ClickRow(int row, Failures &failures) {
+Outcome Selector::ClickRow(int row) {
+  Outcome outcome;
   state_.tally = {};
-  state_.summary.clear();
+  outcome.summary = ""; // a click that changes nothing leaves no line of the action before
   const bool folderRow = state_.Unigrid.IsFolderRow(row);
   const bool wasLoaded = folderRow && IsLoaded(state_.Unigrid.Row(row));
-  const std::vector<std::string> replaced = library::ClickRow(state_, row, caption_, failures);
+  const std::vector<std::string> replaced =
+      library::ClickRow(state_, row, caption_, outcome.failures);
   if (!folderRow || wasLoaded == IsLoaded(state_.Unigrid.Row(row)))
-    return "";
+    return outcome;
   const std::string &name = state_.Unigrid.Row(row).name;
-  state_.summary =
+  outcome.done = true;
+  outcome.summary =
       (wasLoaded ? "Unloaded \"" : "Loaded \"") + name + "\": " + TallyText(state_.tally) + ".";
-  if (replaced.empty())
-    return "";
-  return WithLines(ReplacedNotice(name, replaced), ReplacedFileLines(state_, name, failures));
+  if (!replaced.empty())
+    outcome.notice = WithLines(ReplacedNotice(name, replaced),
+                               ReplacedFileLines(state_, name, outcome.failures));
+  return outcome;
 }
 
-std::string Selector::PressKey(int row, int key, Failures &failures) {
-  return key == kEnterKey ? ClickRow(row, failures) : "";
+Outcome Selector::PressKey(int row, int key) {
+  return key == kEnterKey ? ClickRow(row) : Outcome{};
 }
 
 // The names of the grid's folders, each once (a letter listed twice shows its folders twice).
@@ -131,7 +138,9 @@ static std::string RefreshSummary(const std::set<std::string> &before,
          missingFrom(before, after) + " gone";
 }
 
-void Selector::RefreshLibrary(Failures &failures) {
+Outcome Selector::RefreshLibrary() {
+  Outcome outcome;
+  Failures &failures = outcome.failures;
   const std::set<std::string> before = FolderNames(state_.Unigrid);
   // Start-up writes both files when missing; a rebuild needs them just the same.
   EnsureCategoryFile(state_.LibDir, failures);
@@ -141,7 +150,9 @@ void Selector::RefreshLibrary(Failures &failures) {
   // The rows under the pointer are other folders now, so the next move rebuilds the preview.
   state_.hoveredRow.reset();
   ShowCategory(state_.shownCategory);
-  state_.summary = RefreshSummary(before, FolderNames(state_.Unigrid));
+  outcome.summary = RefreshSummary(before, FolderNames(state_.Unigrid));
+  outcome.done = true;
+  return outcome;
 }
 
 std::vector<std::string> Selector::ResetAllFiles(Failures &failures) const {
@@ -152,17 +163,20 @@ int Selector::ResetAllLoadedFiles(Failures &failures) const {
   return LoadedFileCount(state_, failures);
 }
 
-void Selector::ResetAll(const std::vector<std::string> &names, Failures &failures) {
+Outcome Selector::ResetAll(const std::vector<std::string> &names) {
   // The way back: switching to this setup loads again what the reset unloads.
-  if (!SaveSetup(kBeforeResetAllSetup, failures)) {
-    failures.SetHeading(std::string("Nothing was reset: the loaded folders could not be saved "
-                                    "first as the setup \"") +
-                        kBeforeResetAllSetup + "\".");
-    return;
+  Outcome outcome = SaveSetup(kBeforeResetAllSetup);
+  if (!outcome.done) {
+    outcome.failures.SetHeading(
+        std::string("Nothing was reset: the loaded folders could not be saved "
+                    "first as the setup \"") +
+        kBeforeResetAllSetup + "\".");
+    return outcome;
   }
   state_.tally = {};
-  ::ResetAll(state_, names, caption_, failures);
-  state_.summary = "Reset All: " + TallyText(state_.tally) + ".";
+  ::ResetAll(state_, names, caption_, outcome.failures);
+  outcome.summary = "Reset All: " + TallyText(state_.tally) + ".";
+  return outcome;
 }
 
 std::optional<FolderPreview> Selector::HoverRow(int row) {
@@ -174,11 +188,14 @@ std::optional<FolderPreview> Selector::HoverRow(int row) {
 
 IniValues Selector::ReadSettings(Failures &failures) { return IniRead(state_.EAWDir, failures); }
 
-void Selector::SaveSettings(const IniTexts &texts, Failures &failures) {
-  const int saved = inisave(state_.EAWDir, texts, failures);
-  state_.summary = saved < 0 ? ""
-                             : std::to_string(saved) + (saved == 1 ? " setting" : " settings") +
-                                   " saved to eaw.ini";
+Outcome Selector::SaveSettings(const IniTexts &texts) {
+  Outcome outcome;
+  const int saved = inisave(state_.EAWDir, texts, outcome.failures);
+  outcome.done = saved >= 0;
+  outcome.summary = saved < 0 ? ""
+                              : std::to_string(saved) + (saved == 1 ? " setting" : " settings") +
+                                    " saved to eaw.ini";
+  return outcome;
 }
 
 std::string Selector::SettingsFileText(Failures &failures) {
@@ -190,24 +207,28 @@ std::vector<std::string> Selector::ChangedSettings(const std::string &before,
   return ChangedKeys(before, after);
 }
 
-bool Selector::SaveSettingsFile(const std::string &text, Failures &failures) {
-  const bool saved = IniEditorSave(state_.EAWDir, text, failures);
-  state_.summary = saved ? "eaw.ini saved" : "";
-  return saved;
+Outcome Selector::SaveSettingsFile(const std::string &text) {
+  Outcome outcome;
+  outcome.done = IniEditorSave(state_.EAWDir, text, outcome.failures);
+  outcome.summary = outcome.done ? "eaw.ini saved" : "";
+  return outcome;
 }
 
 MusicList Selector::MusicSets(Failures &failures) { return FillMusicList(state_.EAWDir, failures); }
 
-bool Selector::SwitchMusic(const std::string &activeName, const std::string &chosenName,
-                           Failures &failures) {
-  const bool switched =
-      ::SwitchMusic(state_.EAWDir, activeName, chosenName, MusicJournal(), failures);
-  state_.summary = switched ? "Music set " + chosenName + " is playing" : "";
-  return switched;
+Outcome Selector::SwitchMusic(const std::string &activeName, const std::string &chosenName) {
+  Outcome outcome;
+  outcome.done =
+      ::SwitchMusic(state_.EAWDir, activeName, chosenName, MusicJournal(), outcome.failures);
+  outcome.summary = outcome.done ? "Music set " + chosenName + " is playing" : "";
+  return outcome;
 }
 
-void Selector::StartGame(Failures &failures) {
-  state_.summary = ::StartGame(state_.EAWDir, starter_, failures) ? "Game started" : "";
+Outcome Selector::StartGame() {
+  Outcome outcome;
+  outcome.done = ::StartGame(state_.EAWDir, starter_, outcome.failures);
+  outcome.summary = outcome.done ? "Game started" : "";
+  return outcome;
 }
 
 fs::path Selector::MusicJournal() const { return KeepingFolder(state_.LibDir) / "music.txt"; }
@@ -220,33 +241,38 @@ std::vector<std::string> Selector::Setups() const { return SetupNames(state_.Lib
 
 bool Selector::HasSetup(const std::string &name) const { return SetupExists(state_.LibDir, name); }
 
-bool Selector::SaveSetup(const std::string &name, Failures &failures) {
+Outcome Selector::SaveSetup(const std::string &name) {
+  Outcome outcome;
   // A ledger that cannot be read leaves the grid's order, which is still worth keeping.
-  const std::vector<std::string> loaded = LoadedInOrder(state_, failures);
-  if (!WriteSetup(state_.LibDir, name, loaded, failures))
-    return false;
-  state_.summary = "Saved " + Count(loaded.size(), "loaded folder") + " as \"" + name + "\".";
-  return true;
+  const std::vector<std::string> loaded = LoadedInOrder(state_, outcome.failures);
+  outcome.done = WriteSetup(state_.LibDir, name, loaded, outcome.failures);
+  if (outcome.done)
+    outcome.summary = "Saved " + Count(loaded.size(), "loaded folder") + " as \"" + name + "\".";
+  return outcome;
 }
 
-std::string Selector::SwitchToSetup(const std::string &name, Failures &failures) {
+Outcome Selector::SwitchToSetup(const std::string &name) {
+  Outcome outcome;
   state_.tally = {};
-  state_.summary.clear();
-  const std::optional<std::vector<std::string>> folders = ReadSetup(state_.LibDir, name, failures);
+  outcome.summary = "";
+  const std::optional<std::vector<std::string>> folders =
+      ReadSetup(state_.LibDir, name, outcome.failures);
   if (!folders)
-    return "";
-  const SwitchResult result = SwitchToFolders(state_, *folders, caption_, failures);
-  state_.summary = "Switched to \"" + name + "\": " + Count(result.unloaded, "folder") +
-                   " unloaded, " + std::to_string(result.loaded) + " loaded; " +
-                   TallyText(state_.tally) + ".";
-  std::string notice;
+    return outcome;
+  const SwitchResult result = SwitchToFolders(state_, *folders, caption_, outcome.failures);
+  outcome.done = true;
+  outcome.summary = "Switched to \"" + name + "\": " + Count(result.unloaded, "folder") +
+                    " unloaded, " + std::to_string(result.loaded) + " loaded; " +
+                    TallyText(state_.tally) + ".";
   for (const std::string &line : result.notices)
-    notice += (notice.empty() ? "" : "\n") + line;
-  return notice;
+    outcome.notice += (outcome.notice.empty() ? "" : "\n") + line;
+  return outcome;
 }
 
-bool Selector::DeleteSetup(const std::string &name, Failures &failures) {
-  return RemoveSetup(state_.LibDir, name, failures);
+Outcome Selector::DeleteSetup(const std::string &name) {
+  Outcome outcome;
+  outcome.done = RemoveSetup(state_.LibDir, name, outcome.failures);
+  return outcome;
 }
 
 FolderFileList Selector::FolderFiles(int row, Failures &failures) const {

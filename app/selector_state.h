@@ -15,5 +15,4 @@ struct SelectorState : LibraryState {
   std::filesystem::path NewPic;   // the General Settings page's picture; empty for none
   std::optional<int> hoveredRow;  // the grid row whose preview is shown, -1 the header
   int shownCategory = 0;          // the category list entry the grid shows
-  std::string summary;            // the line that sums up the last action; empty for none
 };

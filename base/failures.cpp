@@ -11,6 +11,13 @@ void Failures::Add(const std::string &text) {
     lines_.push_back(text);
 }
 
+void Failures::Append(const Failures &later) {
+  for (const std::string &line : later.lines_)
+    Add(line);
+  if (!later.heading_.empty())
+    heading_ = later.heading_;
+}
+
 std::string Failures::Message(const std::string &fallback) const {
   std::string text = HeadingOr(fallback);
   for (const std::string &line : lines_)

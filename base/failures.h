@@ -12,6 +12,8 @@ public:
   void Add(const std::filesystem::path &path, const std::string &reason);
   // Records a failure that concerns no single file.
   void Add(const std::string &text);
+  // Adds the failures of `later` after these, and its heading when it has one.
+  void Append(const Failures &later);
   bool Empty() const { return lines_.empty(); }
   const std::vector<std::string> &Lines() const { return lines_; }
   // Gives the message a heading that says more than the caller's: what the failures mean.

@@ -52,16 +52,10 @@ public:
     if (originals)
       for (const auto &copy : copies_)
         WriteBytes(copy.second, 1024);
-    Failures failures;
-    quiet_->selector.StartUp(failures);
-    StopOnFailures(failures);
+    StopOnFailures(quiet_->selector.StartUp().failures);
   }
 
-  void Click() {
-    Failures failures;
-    quiet_->selector.ClickRow(0, failures);
-    StopOnFailures(failures);
-  }
+  void Click() { StopOnFailures(quiet_->selector.ClickRow(0).failures); }
   bool Loaded() const { return IsLoaded(quiet_->selector.State().Unigrid.Row(0)); }
   void Unload() {
     if (Loaded())
@@ -296,10 +290,10 @@ void BenchResetAll(const fs::path &root, int pairs) {
       WriteBytes(file.second, 2048);
   };
   QuietSelector quiet(game.game);
-  Failures failures;
-  quiet.selector.StartUp(failures);
+  Failures failures = quiet.selector.StartUp().failures;
   const Side ours{addAddonFiles, [&] {
-                    quiet.selector.ResetAll(quiet.selector.ResetAllFiles(failures), failures);
+                    failures.Append(
+                        quiet.selector.ResetAll(quiet.selector.ResetAllFiles(failures)).failures);
                   }};
   const std::vector<std::string> patterns = SplitPatterns(kDefaultCleanUpPatterns);
   std::vector<std::string> folded;
@@ -332,15 +326,15 @@ void BenchCloneLoad(const fs::path &root, int pairs) {
     copies.emplace_back(game.library / "S-Big" / name, game.game / name);
   }
   QuietSelector quiet(game.game);
-  Failures failures;
-  quiet.selector.StartUp(failures);
+  Failures failures = quiet.selector.StartUp().failures;
   const auto clear = [&] {
     if (IsLoaded(quiet.selector.State().Unigrid.Row(0)))
-      quiet.selector.ClickRow(0, failures);
+      failures.Append(quiet.selector.ClickRow(0).failures);
     PlainRemovals(copies);
   };
   PrintResult("load 20 x 50 MB, reflink file system / copy loop",
-              RunPairs(pairs, {clear, [&] { quiet.selector.ClickRow(0, failures); }},
+              RunPairs(pairs,
+                       {clear, [&] { failures.Append(quiet.selector.ClickRow(0).failures); }},
                        {clear, [&] { PlainCopies(copies); }}),
               0.05);
   clear();

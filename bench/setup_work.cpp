@@ -46,14 +46,13 @@ public:
         sets_[set].push_back(
             MakeFolder(game_, "N-" + std::string(set) + std::to_string(k + 10), kFilesEach));
     MakeFolder(game_, "N-Big", kBigFolder);
-    Failures failures;
-    quiet_.selector.StartUp(failures);
+    Failures failures = quiet_.selector.StartUp().failures;
     const FolderGrid &grid = quiet_.selector.State().Unigrid;
     for (int row = 0; row < grid.RowCount(); ++row)
       rows_[grid.Row(row).name] = row;
     for (const char *set : {"A", "B"}) {
       ClickAll(sets_[set]);
-      quiet_.selector.SaveSetup(set, failures);
+      failures.Append(quiet_.selector.SaveSetup(set).failures);
       ClickAll({sets_[set].rbegin(), sets_[set].rend()});
     }
     StopOnFailures(failures);
@@ -62,13 +61,11 @@ public:
   void Ensure(const std::string &set) {
     Failures failures;
     if (quiet_.selector.LoadedFolderNames(failures) != sets_[set])
-      quiet_.selector.SwitchToSetup(set, failures);
+      failures.Append(quiet_.selector.SwitchToSetup(set).failures);
     StopOnFailures(failures);
   }
   void Switch(const std::string &set) {
-    Failures failures;
-    quiet_.selector.SwitchToSetup(set, failures);
-    StopOnFailures(failures);
+    StopOnFailures(quiet_.selector.SwitchToSetup(set).failures);
   }
   // What a player would click: each folder of `from` off, the last loaded first, then `to` on.
   void OneByOne(const std::string &from, const std::string &to) {
@@ -82,7 +79,7 @@ private:
   void ClickAll(const std::vector<std::string> &names) {
     Failures failures;
     for (const std::string &name : names)
-      quiet_.selector.ClickRow(rows_.at(name), failures);
+      failures.Append(quiet_.selector.ClickRow(rows_.at(name)).failures);
     StopOnFailures(failures);
   }
 

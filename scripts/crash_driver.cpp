@@ -149,23 +149,22 @@ int main(int argc, char **argv) {
   StoredCaption caption;
   NoProgramStarter starter;
   Selector selector(game, caption, starter);
-  Failures failures;
-  selector.StartUp(failures);
+  Failures failures = selector.StartUp().failures;
   if (step == "click") {
     const FolderGrid &grid = selector.State().Unigrid;
     for (int row = 0; row < grid.RowCount(); ++row)
       if (grid.Row(row).name == name) {
-        selector.ClickRow(row, failures);
+        failures.Append(selector.ClickRow(row).failures);
         break;
       }
   } else if (step == "reset") {
-    selector.ResetAll(selector.ResetAllFiles(failures), failures);
+    failures.Append(selector.ResetAll(selector.ResetAllFiles(failures)).failures);
   } else if (step == "ini") {
-    selector.SaveSettingsFile("[Main]\r\nWidth=800", failures);
+    failures.Append(selector.SaveSettingsFile("[Main]\r\nWidth=800").failures);
   } else if (step == "music") {
     const MusicList music = selector.MusicSets(failures);
     if (music.current && !music.entries.empty())
-      selector.SwitchMusic(*music.current, music.entries.front(), failures);
+      failures.Append(selector.SwitchMusic(*music.current, music.entries.front()).failures);
   }
   for (const std::string &line : failures.Lines())
     std::cerr << line << '\n';

@@ -8,7 +8,7 @@
 #include "library/move_out.h"
 #include "library/reset_all.h"
 #include "settings/eaw_ini.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <windows.h>
 
@@ -189,7 +189,7 @@ TEST(WindowsNames, MusicSetsWithTrailingBlanksAndDotsFindTheirFolders) {
   const MusicList music = selector.MusicSets(failures);
   EXPECT_EQ(music.entries, (std::vector<std::string>{"Set1 ", "Set2."}));
   EXPECT_EQ(music.current, "Set3");
-  EXPECT_TRUE(selector.SwitchMusic("Set3", "Set1 ", failures));
+  EXPECT_TRUE(Gathered(selector.SwitchMusic("Set3", "Set1 "), failures).done);
   EXPECT_TRUE(game.Exists("Music/one.bgm"));
   EXPECT_TRUE(game.Exists("Set3/three.bgm"));
   EXPECT_TRUE(failures.Empty()) << failures.Message("");

@@ -14,7 +14,7 @@ TEST_F(CategoryView, LettersBeyondAsciiListTheirFoldersAndNoLetterListsTheProgra
   game.MakeFolder("ZEP128/\xC4-latin"); // a name in Windows-1252 bytes
 #endif
   game.MakeFolder("ZEP128/#Selector");
-  selector.StartUp(failures);
+  Gather(selector.StartUp());
   const auto shown = [&](int entry) {
     selector.ShowCategory(entry);
     std::vector<std::string> names;

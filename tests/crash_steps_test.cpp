@@ -110,7 +110,7 @@ protected:
   }
   void Start() {
     selector = std::make_unique<Selector>(game->Path(), caption, starter);
-    selector->StartUp(failures);
+    Gathered(selector->StartUp(), failures);
   }
   // The game as the ledger says it must be: each name the copy of the last loaded folder that
   // provides it, else the game's own file, else nothing; record and ledger agree, no journal and
@@ -165,6 +165,7 @@ INSTANTIATE_TEST_SUITE_P(
                       Operation{"ResetAll",
                                 {"N-A", "N-B", "S-X"},
                                 [](Selector &selector, Failures &failures) {
-                                  selector.ResetAll(selector.ResetAllFiles(failures), failures);
+                                  Gathered(selector.ResetAll(selector.ResetAllFiles(failures)),
+                                           failures);
                                 }}),
     [](const ::testing::TestParamInfo<Operation> &info) { return std::string(info.param.name); });

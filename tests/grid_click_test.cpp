@@ -18,13 +18,13 @@ protected:
 TEST_F(GridClick, GreenRowUnloadsEnterClicksOtherKeysAndRowsOutsideDoNothing) {
   game.Addon("S-One", {"one.dat"});
   game.WithCategories("Campaigns: C\r\nSounds: N\r\nSkins: S\r\n");
-  selector.ClickRow(0, failures); // empty grid
-  selector.StartUp(failures);
-  selector.ClickRow(-1, failures); // above the first row
+  Gather(selector.ClickRow(0)); // empty grid
+  Gather(selector.StartUp());
+  Gather(selector.ClickRow(-1)); // above the first row
   const int row = RowOf(State().Unigrid, "S-One");
-  selector.PressKey(row, 'a', failures);
+  Gather(selector.PressKey(row, 'a'));
   EXPECT_FALSE(game.Exists("one.dat"));
-  selector.PressKey(row, kEnterKey, failures);
+  Gather(selector.PressKey(row, kEnterKey));
   EXPECT_TRUE(game.Exists("one.dat"));
   EXPECT_EQ(State().Unigrid.currentCol, 1); // coloured in its name column
   Click("S-One");
@@ -41,7 +41,7 @@ TEST_F(GridClick, ReplayMarksRowsWithoutTouchingFiles) {
   const std::string record = "S-One\r\nS-Two\r\nC-A\r\nC-B\r\n\r\n";
   game.WithRecord(record);
   game.WithCategories("Campaigns: C\r\nSkins: S\r\nSkins again: S\r\n"); // S is listed twice
-  selector.StartUp(failures);
+  Gather(selector.StartUp());
 
   for (const char *kept :
        {"one.dat", "two.dat", "Savedata/a.msn", "Savedata/b.msn", "Savedata/war.sve"})

@@ -33,11 +33,11 @@ protected:
   // Starts the program, unloads every loaded folder and resets all.
   void StartAndUnloadAll() {
     Selector selector(game, caption, starter);
-    selector.StartUp(failures);
+    failures.Append(selector.StartUp().failures);
     for (int row = 0; row < selector.State().Unigrid.RowCount(); ++row)
       if (IsLoaded(selector.State().Unigrid.Row(row)))
-        selector.ClickRow(row, failures);
-    selector.ResetAll(selector.ResetAllFiles(failures), failures);
+        failures.Append(selector.ClickRow(row).failures);
+    failures.Append(selector.ResetAll(selector.ResetAllFiles(failures)).failures);
   }
   std::string Absolute(const std::string &relative) const {
     return DisplayPath(outer.Path() / relative);

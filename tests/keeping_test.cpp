@@ -29,9 +29,9 @@ protected:
   // A new start of the program on the same game folder.
   void Restart() {
     selector = std::make_unique<Selector>(game.Path(), caption, starter);
-    selector->StartUp(failures);
+    Gathered(selector->StartUp(), failures);
   }
-  std::string Click(const std::string &folder) { return ClickFolder(*selector, folder, failures); }
+  Outcome Click(const std::string &folder) { return ClickFolder(*selector, folder, failures); }
   std::string Mark(const std::string &folder) const { return MarkOf(*selector, folder); }
 
   static inline const std::string kOriginal = std::string("the game's own\0\xff bases", 23);
@@ -45,11 +45,11 @@ protected:
 } // namespace
 
 TEST_F(Keeping, AnUnloadPutsBackTheFileOfTheFolderLoadedLast) {
-  EXPECT_EQ(Click("N-A"), "");
-  EXPECT_EQ(Click("N-B"), "\"N-B\" replaced files of \"N-A\", which stay loaded. Unloading "
-                          "\"N-B\" puts their files back.\nbases.dat, \"N-A\"'s copy\n"
-                          "sky.spt, \"N-A\"'s copy");
-  EXPECT_NE(Click("N-C").find("replaced files of \"N-B\", which"), std::string::npos);
+  EXPECT_EQ(Click("N-A").notice, "");
+  EXPECT_EQ(Click("N-B").notice, "\"N-B\" replaced files of \"N-A\", which stay loaded. Unloading "
+                                 "\"N-B\" puts their files back.\nbases.dat, \"N-A\"'s copy\n"
+                                 "sky.spt, \"N-A\"'s copy");
+  EXPECT_NE(Click("N-C").notice.find("replaced files of \"N-B\", which"), std::string::npos);
   EXPECT_EQ(game.Read("sky.spt"), "N-C");
   Click("N-C");
   EXPECT_EQ(game.Read("sky.spt"), "N-B");
@@ -63,8 +63,7 @@ TEST_F(Keeping, AnUnloadPutsBackTheFileOfTheFolderLoadedLast) {
 }
 
 TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
-  Click("N-A");
-  EXPECT_EQ(selector->State().summary, "Loaded \"N-A\": 3 files copied.");
+  EXPECT_EQ(Click("N-A").summary, "Loaded \"N-A\": 3 files copied.");
   EXPECT_EQ(game.Read("bases.dat"), "bases of A");
   EXPECT_EQ(game.Read("Savedata/a.msn"), "mission of A");
   Restart(); // the kept originals outlast the program
@@ -72,8 +71,7 @@ TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
   Click("N-A");
   EXPECT_EQ(game.Read("bases.dat"), "bases of B");
   EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
-  Click("N-B");
-  EXPECT_EQ(selector->State().summary, "Unloaded \"N-B\": 1 file deleted, 1 put back.");
+  EXPECT_EQ(Click("N-B").summary, "Unloaded \"N-B\": 1 file deleted, 1 put back.");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
 
   Click("N-A");
@@ -84,8 +82,7 @@ TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
   EXPECT_EQ(selector->ResetAllLoadedFiles(failures), 3);
   // Gone while the player was asked: neither a failure nor a deletion.
   fs::remove(game.Path() / "sky.spt");
-  selector->ResetAll(names, failures);
-  EXPECT_EQ(selector->State().summary, "Reset All: 2 files put back.");
+  EXPECT_EQ(Gathered(selector->ResetAll(names), failures).summary, "Reset All: 2 files put back.");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
   EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
   EXPECT_FALSE(game.Exists("sky.spt"));
@@ -135,10 +132,9 @@ TEST_F(Keeping, AFolderGoneFromTheLibraryOrPartlyLoadedIsSaidSo) {
   ASSERT_EQ(failures.Lines().size(), 1u);
   EXPECT_NE(failures.Lines()[0].find("is no longer in the library"), std::string::npos);
 
-  Failures partly;
   game.MakeFolder("sky.spt.partial/in the way");
   game.MakeFolder("sky.spt/in the way");
-  ClickFolder(*selector, "N-B", partly);
+  const Failures partly = Click("N-B").failures;
   EXPECT_EQ(Mark("N-B"), "S");
   EXPECT_EQ(partly.Lines().size(), 1u);
   EXPECT_EQ(partly.HeadingOr("").find("\"N-B\" is only partly loaded"), 0u);
@@ -169,8 +165,7 @@ TEST_F(Keeping, ACopyThatCannotBeDeletedStaysListedIsTriedAgainAndIsNoOriginal) 
     // The game holds sky.spt open; here something that cannot be deleted takes its place.
     fs::remove(game.Path() / "sky.spt");
     game.Write("sky.spt/held");
-    Failures held;
-    ClickFolder(*selector, "N-C", held);
+    const Failures held = Click("N-C").failures;
     EXPECT_NE(held.Message("").find("sky.spt"), std::string::npos);
     fs::remove_all(game.Path() / "sky.spt");
     game.Write("sky.spt", "N-C"); // released
@@ -221,7 +216,7 @@ TEST_F(Keeping, ResetAllUnloadsEveryFolderInEveryPlaceThenDeletesTheOtherMatches
   game.Write("readme.txt", "another match");
   EXPECT_EQ(selector->ResetAllFiles(failures), std::vector<std::string>{"readme.txt"});
   EXPECT_EQ(selector->ResetAllLoadedFiles(failures), 5);
-  selector->ResetAll({"readme.txt"}, failures);
+  Gathered(selector->ResetAll({"readme.txt"}), failures);
   for (const char *gone : {"notes.xyz", "Music/tune.bgm", "sky.spt", "readme.txt"})
     EXPECT_FALSE(game.Exists(gone)) << gone;
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);

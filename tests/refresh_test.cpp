@@ -17,10 +17,10 @@ TEST_F(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   const SelectorState &state = selector.State();
   // The category list is read at start-up only: a refresh keeps its letters.
   game.WithCategories("Skins: S\r\n");
-  selector.StartUp(failures);
+  Gather(selector.StartUp());
   fs::remove(game.Path() / "ZEP128/zep.ini");
   fs::remove(game.Path() / "ZEP128/FoldersLoaded.txt");
-  selector.RefreshLibrary(failures);
+  Gather(selector.RefreshLibrary());
   EXPECT_EQ(game.Read("ZEP128/zep.ini"), DefaultCategoryText());
   EXPECT_TRUE(game.Exists("ZEP128/FoldersLoaded.txt"));
   EXPECT_EQ(RowNames(state.Unigrid, true), (Names{"F-Spit", "S-Camo", "G-Sky"}));
@@ -31,7 +31,7 @@ TEST_F(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   game.MakeFolder("ZEP128/S-Desert");
   selector.ShowCategory(2);
   selector.HoverRow(1);
-  selector.RefreshLibrary(failures);
+  const Outcome refreshed = Gather(selector.RefreshLibrary());
 
   EXPECT_EQ(RowNames(state.Unigrid, true),
             (Names{"F-Hurri", "S-Camo [S]", "S-Desert", "G-Sky [S]"}));
@@ -39,7 +39,7 @@ TEST_F(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   for (int row = 0; row < state.Unigrid.RowCount(); ++row)
     EXPECT_EQ(state.Unigrid.Row(row).shown, row == 1 || row == 2) << row;
   EXPECT_EQ(state.Unigrid.rule, "Only one selection can be made!");
-  EXPECT_EQ(state.summary, "Refresh: 4 folders, 2 new, 1 gone");
+  EXPECT_EQ(refreshed.summary, "Refresh: 4 folders, 2 new, 1 gone");
   EXPECT_EQ(state.Codes, (Names{"S"}));
   EXPECT_FALSE(state.hoveredRow);
   EXPECT_EQ(ListFiles(game.Path()), (Names{"planes.dat"}));

@@ -10,7 +10,7 @@ TEST_F(Refusals, AFileTooLargeToBeSettingsIsNamedAndLeftAlone) {
   const std::string empties((1 << 20) + 1, '\n');
   game.Write("eaw.ini", empties);
   EXPECT_FALSE(selector.ReadSettings(failures)[0]);
-  selector.SaveSettings({"1024"}, failures);
+  Gather(selector.SaveSettings({"1024"}));
   EXPECT_EQ(game.Read("eaw.ini"), empties);
   ASSERT_FALSE(failures.Empty());
   EXPECT_NE(failures.Lines()[0].find("eaw.ini: was not read: it is 1024 KB"), std::string::npos);
@@ -25,8 +25,8 @@ TEST_F(Refusals, FoldersTheGameNeedsAreNoMusicSets) {
   const MusicList music = selector.MusicSets(failures);
   EXPECT_EQ(music.entries, std::vector<std::string>{"Set1"});
   EXPECT_EQ(music.current, "Set2");
-  EXPECT_FALSE(selector.SwitchMusic("Set2", "zep128", failures));
-  EXPECT_FALSE(selector.SwitchMusic("Savedata", "Set1", failures));
+  EXPECT_FALSE(Gather(selector.SwitchMusic("Set2", "zep128")).done);
+  EXPECT_FALSE(Gather(selector.SwitchMusic("Savedata", "Set1")).done);
   EXPECT_TRUE(game.Exists("ZEP128/zep.ini"));
   EXPECT_TRUE(game.Exists("Savedata/a.sve"));
   EXPECT_TRUE(game.Exists("Music/b.bgm"));
@@ -39,8 +39,8 @@ TEST_F(Refusals, NamesOfTheLongestLengthAreLoaded) {
   const std::string name = std::string(246, 'n') + ".dat";
   game.WithCategories("Skins: S\r\n");
   game.Write("ZEP128/S-Long/" + name, "long");
-  selector.StartUp(failures);
-  selector.ClickRow(0, failures);
+  Gather(selector.StartUp());
+  Gather(selector.ClickRow(0));
   EXPECT_EQ(game.Read(name), "long");
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
@@ -79,9 +79,9 @@ TEST(Reasons, AFullDiskAHeldFileAndNamesWindowsCannotKeepAreCalledSo) {
 TEST_F(Refusals, AFolderThatCouldNotBeLoadedAtAllIsNotMarkedLoaded) {
   game.WithCategories("Skins: S\r\n");
   game.Addon("S-a", {"a.dat"});
-  selector.StartUp(failures);
+  Gather(selector.StartUp());
   game.MakeFolder("ZEP128/#Selector/journal.txt.partial"); // the journal cannot be written
-  selector.ClickRow(RowOf(selector.State().Unigrid, "S-a"), failures);
+  Gather(selector.ClickRow(RowOf(selector.State().Unigrid, "S-a")));
   EXPECT_FALSE(IsLoaded(selector.State().Unigrid.Row(RowOf(selector.State().Unigrid, "S-a"))));
   EXPECT_FALSE(game.Exists("a.dat"));
   EXPECT_EQ(game.Record(), "");

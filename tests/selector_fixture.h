@@ -5,9 +5,15 @@
 
 #include <gtest/gtest.h>
 
-// Clicks the first grid row named `folder`; returns the click's notice.
-inline std::string ClickFolder(Selector &selector, const std::string &folder, Failures &failures) {
-  return selector.ClickRow(RowOf(selector.State().Unigrid, folder), failures);
+// Adds what a verb could not do to `failures`, one collector for a test's run; returns the outcome.
+inline Outcome Gathered(Outcome outcome, Failures &failures) {
+  failures.Append(outcome.failures);
+  return outcome;
+}
+
+// Clicks the first grid row named `folder`, gathering its failures into `failures`.
+inline Outcome ClickFolder(Selector &selector, const std::string &folder, Failures &failures) {
+  return Gathered(selector.ClickRow(RowOf(selector.State().Unigrid, folder)), failures);
 }
 
 // The mark of the first grid row named `folder`: "S" when loaded.
@@ -19,8 +25,9 @@ inline std::string MarkOf(const Selector &selector, const std::string &folder) {
 // A Selector on a fresh game folder, for tests that drive the program's verbs.
 class SelectorTest : public ::testing::Test {
 protected:
-  std::string Click(const std::string &folder) { return ClickFolder(selector, folder, failures); }
+  Outcome Click(const std::string &folder) { return ClickFolder(selector, folder, failures); }
   std::string Mark(const std::string &folder) const { return MarkOf(selector, folder); }
+  Outcome Gather(Outcome outcome) { return Gathered(std::move(outcome), failures); }
 
   GameFolder game;
   RecordingCaption caption;

@@ -47,6 +47,9 @@ TEST(SettingsWindow, BoxesShowTheFileAndEnterSavesThemOrSaysWhyNot) {
   const QStringList messages = driver.TakeMessages();
   ASSERT_EQ(messages.size(), 1);
   EXPECT_TRUE(messages[0].contains("eaw.ini"));
+  EXPECT_EQ(driver.Summary(), kInstructions); // the line of the save before is gone
+  QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
+  EXPECT_TRUE(driver.TakeMessages().join("|").startsWith("The settings file could not be saved:"));
 }
 
 TEST(SettingsWindow, EditorShowsFollowsTheBoxesAsksBeforeSavingOverAChangeAndHides) {

@@ -99,6 +99,7 @@ TEST(SetupMenuWindow, SavesSwitchesDeletesAndCopiesSetups) {
   ASSERT_NE(sure, nullptr);
   sure->button(QMessageBox::Yes)->click();
   EXPECT_FALSE(game.Exists("ZEP128/#Selector/setups/Two sounds.txt"));
+  EXPECT_TRUE(driver.Summary().startsWith("Switched to")); // a deletion keeps the line
 
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 }

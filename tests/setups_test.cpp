@@ -25,7 +25,7 @@ protected:
     game.Write("ZEP128/N-y/n.wav", "y");
     game.Write("ZEP128/N-x/shared.dat", "x");
     game.Write("orig.dat", "the game's");
-    selector.StartUp(failures);
+    Gather(selector.StartUp());
   }
   Names Loaded() { return selector.LoadedFolderNames(failures); }
   std::string Setup(const std::string &name) {
@@ -39,17 +39,16 @@ TEST_F(Setups, SaveKeepsLoadOrderAndSwitchingKeepsTheRulesAndGoesBack) {
   Click("N-y");
   Click("S-a");
   Click("N-x");
-  ASSERT_TRUE(selector.SaveSetup("Mine", failures));
+  EXPECT_EQ(Gather(selector.SaveSetup("Mine")).summary, "Saved 3 loaded folders as \"Mine\".");
   EXPECT_EQ(Setup("Mine"), "N-y\r\nS-a\r\nN-x\r\n");
-  EXPECT_EQ(selector.State().summary, "Saved 3 loaded folders as \"Mine\".");
   // Written by hand: a byte-order mark, trailing blanks, a blank line, two skins, a campaign, a
   // folder that is gone.
   game.Write("ZEP128/#Selector/setups/hand.TXT",
              "\xEF\xBB\xBFS-a\r\nN-x  \r\n\r\nN-Gone\nS-b\r\nC-one\r\nN-y");
   EXPECT_EQ(selector.Setups(), (Names{"hand", "Mine"}));
-  const std::string notice = selector.SwitchToSetup("hand", failures);
-  EXPECT_EQ(notice, "Only one folder of letter \"S\" can be loaded: \"S-b\" was loaded, not "
-                    "\"S-a\".");
+  const Outcome switched = Gather(selector.SwitchToSetup("hand"));
+  EXPECT_EQ(switched.notice, "Only one folder of letter \"S\" can be loaded: \"S-b\" was "
+                             "loaded, not \"S-a\".");
   ASSERT_EQ(failures.Lines(), Names{"\"N-Gone\" is not in the library, so it was not loaded"});
   // N-y was loaded before N-x, against the setup's order: it goes and comes back after it.
   EXPECT_EQ(Loaded(), (Names{"N-x", "S-b", "C-one", "N-y"}));
@@ -57,11 +56,11 @@ TEST_F(Setups, SaveKeepsLoadOrderAndSwitchingKeepsTheRulesAndGoesBack) {
   EXPECT_EQ(game.Read("shared.dat"), "shared.dat");
   EXPECT_FALSE(game.Exists("a.dat"));
   EXPECT_EQ(game.Read("orig.dat"), "the game's");
-  EXPECT_EQ(selector.State().summary,
+  EXPECT_EQ(switched.summary,
             "Switched to \"hand\": 3 folders unloaded, 4 loaded; 8 files copied, 7 deleted, "
             "2 put back.");
 
-  selector.SwitchToSetup("Mine", failures);
+  Gather(selector.SwitchToSetup("Mine"));
   EXPECT_EQ(Loaded(), (Names{"N-y", "S-a", "N-x"}));
   EXPECT_EQ(game.Read("n.wav"), "x");
   EXPECT_EQ(game.Read("shared.dat"), "x");
@@ -74,24 +73,23 @@ TEST_F(Setups, ResetAllSavesTheWayBackAndSwitchingUndoesIt) {
   Click("S-a");
   Click("N-x");
   game.Write("ZEP128/#Selector/setups/Before Reset All.txt", "N-y\r\n");
-  selector.ResetAll(selector.ResetAllFiles(failures), failures);
+  Gather(selector.ResetAll(selector.ResetAllFiles(failures)));
   EXPECT_EQ(Loaded(), Names{});
   EXPECT_EQ(game.Read("orig.dat"), "the game's");
   EXPECT_EQ(Setup("Before Reset All"), "S-a\r\nN-x\r\n");
-  selector.SwitchToSetup("Before Reset All", failures);
+  Gather(selector.SwitchToSetup("Before Reset All"));
   EXPECT_EQ(Loaded(), (Names{"S-a", "N-x"}));
   EXPECT_EQ(game.Read("orig.dat"), "orig.dat");
   EXPECT_EQ(game.Read("shared.dat"), "x");
-  selector.SwitchToSetup("Before Reset All", failures);
-  EXPECT_EQ(selector.State().summary,
+  EXPECT_EQ(Gather(selector.SwitchToSetup("Before Reset All")).summary,
             "Switched to \"Before Reset All\": 0 folders unloaded, 0 loaded; no file changed.");
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
-  EXPECT_TRUE(selector.DeleteSetup("before reset all", failures));
+  EXPECT_TRUE(Gather(selector.DeleteSetup("before reset all")).done);
   EXPECT_EQ(selector.Setups(), Names{});
-  EXPECT_FALSE(selector.DeleteSetup("Before Reset All", failures));
+  EXPECT_FALSE(Gather(selector.DeleteSetup("Before Reset All")).done);
   // A setup whose writing a crash cut short leaves its temporary file; the next start removes it.
   game.Write("ZEP128/#Selector/setups/Before Reset All.txt.partial", "S-a\r\n");
-  Selector(game.Path(), caption, starter).StartUp(failures);
+  Gather(Selector(game.Path(), caption, starter).StartUp());
   EXPECT_FALSE(game.Exists("ZEP128/#Selector/setups/Before Reset All.txt.partial"));
 }
 
@@ -108,14 +106,14 @@ TEST_F(Setups, HostileSetupsAndNamesAreRefusedWhole) {
         std::string("N-x\r\nC:S-b"), std::string("N-x\r\nnul.txt"), many,
         "N-x\r\n" + std::string(1 << 20, ' ')}) {
     game.Write("ZEP128/#Selector/setups/bad.txt", bytes);
-    Failures refused;
-    EXPECT_EQ(selector.SwitchToSetup("bad", refused), "");
-    EXPECT_TRUE(Has(refused.HeadingOr(""), "The setup \"bad\" was not used"))
+    const Outcome refused = selector.SwitchToSetup("bad");
+    EXPECT_EQ(refused.notice, "");
+    EXPECT_TRUE(Has(refused.failures.HeadingOr(""), "The setup \"bad\" was not used"))
         << bytes.substr(0, 20);
     EXPECT_EQ(Loaded(), Names{"S-a"});
   }
   for (const char *name : {"", "..", "a/b", "a\\b", "CON", "lpt1.x", "x?", "a*", "<b>", "dot."})
-    EXPECT_FALSE(selector.SaveSetup(name, failures)) << name;
+    EXPECT_FALSE(Gather(selector.SaveSetup(name)).done) << name;
   EXPECT_EQ(selector.Setups(), Names{"bad"});
 }
 
@@ -135,8 +133,8 @@ TEST_F(Setups, FilesOfAFolderSayWhereEachStandsAndWhoElseHasIt) {
   EXPECT_EQ(states("S-b"),
             (Names{"b.dat game folder: not loaded",
                    "shared.dat game folder: not loaded; a load replaces \"N-x\"'s copy"}));
-  EXPECT_EQ(Click("S-b"), "\"S-b\" replaced files of \"N-x\", which stay loaded. Unloading "
-                          "\"S-b\" puts their files back.\nshared.dat, \"N-x\"'s copy");
+  EXPECT_EQ(Click("S-b").notice, "\"S-b\" replaced files of \"N-x\", which stay loaded. Unloading "
+                                 "\"S-b\" puts their files back.\nshared.dat, \"N-x\"'s copy");
   Click("N-x");
   Click("N-x");
   EXPECT_EQ(states("S-b"), (Names{"b.dat game folder: loaded",

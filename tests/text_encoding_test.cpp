@@ -68,7 +68,7 @@ TEST_F(Windows1252Files, NameTheFoldersAndFilesTheyMean) {
   game.MakeFolder("Kl\xC3\xA4nge");
   game.Write("ZEP128/CleanUp.ini", "*.d\xE4t\r\n");
   game.Write("alt.d\xC3\xA4t");
-  selector.StartUp(failures);
+  Gather(selector.StartUp());
   const SelectorState &state = selector.State();
   EXPECT_EQ(state.List3.back(), "Skins f\xC3\xBCr alle");
   EXPECT_EQ(RowNames(state.Unigrid, true), Names{"S-J\xC3\xA4ger [S]"});

@@ -3,9 +3,7 @@
 #include "platform/qt_paths.h"
 #include "ui/event_hook.h"
 #include "ui/failure_box.h"
-#include "ui/fitted_text.h"
 #include "ui/folder_grid_model.h"
-#include "ui/input_blocker.h"
 #include "ui/picture.h"
 #include "ui/setup_menu.h"
 #include "ui/slot_grid_view.h"
@@ -33,10 +31,8 @@ MainWindow::MainWindow(const fs::path &eawDir)
   c_.Unigrid->setModel(gridModel_);
   WireEvents();
   WireHooks();
-  connect(new SetupMenu(selector_, c_.Unigrid, this), &SetupMenu::Changed, this, [this] {
-    ShowSummary();
-    ShowGridChanges();
-  });
+  connect(new SetupMenu(selector_, runner_, c_.Unigrid, this), &SetupMenu::Changed, this,
+          &MainWindow::ShowGridChanges);
   starter_.OnQuickFailure([this](const QString &program, const QString &status) {
     ShowNotice(this, ToName(program + " ended at once (" + status + "): the game did not start."));
   });
@@ -120,9 +116,8 @@ void MainWindow::WireHooks() {
 }
 
 void MainWindow::FormLoad() {
-  Failures failures;
   c_.EAWDirLabel->setText(FromPath(State().EAWDir));
-  selector_.StartUp(failures);
+  const Failures failures = selector_.StartUp().failures;
   ShowScreenSize();
   c_.Label3->setText("Concept: by and for the players\r\n"
                      "Programmed in C++ with Qt\r\n");
@@ -140,7 +135,7 @@ void MainWindow::FormLoad() {
   ShowGridChanges();
   FillMusicList();
   // Finishing an interrupted operation showed its progress in the instructions' place.
-  ShowSummary();
+  runner_.ShowSummary();
   QTimer::singleShot(
       0, this, [this, failures] { ShowFailures(this, failures, "Start-up could not do all:"); });
 }
@@ -177,15 +172,13 @@ void MainWindow::List3_Click(int k) {
 }
 
 void MainWindow::Label33_Click() {
-  Failures failures;
-  {
-    const InputBlocker blocker;
-    selector_.RefreshLibrary(failures);
-  }
-  ShowGridRows();
-  ShowGridChanges();
-  ShowSummary();
-  ShowFailures(this, failures, "Refresh could not do all:");
+  runner_.Run(
+      VerbRunner::Input::blocked, [this] { return selector_.RefreshLibrary(); },
+      "Refresh could not do all:",
+      [this](Outcome &) {
+        ShowGridRows();
+        ShowGridChanges();
+      });
 }
 
 void MainWindow::Command1_Click() {
@@ -194,42 +187,24 @@ void MainWindow::Command1_Click() {
   const int loadedFiles = selector_.ResetAllLoadedFiles(failures);
   if ((loadedFiles > 0 || !names.empty()) && !ConfirmDeletion(this, loadedFiles, names))
     return;
-  {
-    const InputBlocker blocker;
-    selector_.ResetAll(names, failures);
-  }
-  ShowSummary();
-  ShowGridChanges();
-  ShowFailures(this, failures, "Reset All could not delete these files:");
+  runner_.Run(
+      VerbRunner::Input::blocked, [&] { return AfterAsking(failures, selector_.ResetAll(names)); },
+      "Reset All could not delete these files:", [this](Outcome &) { ShowGridChanges(); });
 }
 
 void MainWindow::Unigrid_Click(const QModelIndex &index) {
-  Failures failures;
-  std::string notice;
-  {
-    const InputBlocker blocker;
-    notice = selector_.ClickRow(index.row(), failures);
-  }
-  ShowSummary();
-  ShowGridChanges();
-  ShowFailures(this, failures, "Some files could not be handled:");
-  ShowNotice(this, notice);
+  runner_.Run(
+      VerbRunner::Input::blocked, [&] { return selector_.ClickRow(index.row()); },
+      "Some files could not be handled:", [this](Outcome &) { ShowGridChanges(); });
 }
 
 void MainWindow::Unigrid_KeyPress(int key) {
   const QModelIndex current = c_.Unigrid->currentIndex();
   if (!current.isValid())
     return;
-  Failures failures;
-  std::string notice;
-  {
-    const InputBlocker blocker;
-    notice = selector_.PressKey(current.row(), key, failures);
-  }
-  ShowSummary();
-  ShowGridChanges();
-  ShowFailures(this, failures, "Some files could not be handled:");
-  ShowNotice(this, notice);
+  runner_.Run(
+      VerbRunner::Input::blocked, [&] { return selector_.PressKey(current.row(), key); },
+      "Some files could not be handled:", [this](Outcome &) { ShowGridChanges(); });
 }
 
 // Typed letters go to the next shown row whose name starts with them, as in any list; the same
@@ -276,13 +251,14 @@ void MainWindow::inisave() {
   IniTexts texts;
   for (size_t key = 0; key < kSettingCount; ++key)
     texts[key] = ToName(c_.SettingsBoxes[key]->text());
-  Failures failures;
-  selector_.SaveSettings(texts, failures);
-  ShowSummary();
-  // The editor shows the file as it is now, unless the player has changed its text.
-  if (!State().summary.empty() && c_.Frame21->isVisible() && !EditorEdited())
-    ShowEditorText(failures);
-  ShowFailures(this, failures, "The settings could not be saved:");
+  runner_.Run(
+      VerbRunner::Input::open, [&] { return selector_.SaveSettings(texts); },
+      "The settings could not be saved:",
+      [this](Outcome &outcome) {
+        // The editor shows the file as it is now, unless the player has changed its text.
+        if (outcome.done && c_.Frame21->isVisible() && !EditorEdited())
+          ShowEditorText(outcome.failures);
+      });
 }
 
 void MainWindow::IniEdit_Click() {
@@ -314,12 +290,17 @@ void MainWindow::InSaver_Click() {
                            "). Save the editor's text over it?"))
       return;
   }
-  if (selector_.SaveSettingsFile(ToText(EditorText(), editorWindows1252_), failures)) {
-    editorFile_ = selector_.SettingsFileText(failures);
-    IniRead();
-  }
-  ShowSummary();
-  ShowFailures(this, failures, "The settings file could not be saved:");
+  const std::string text = ToText(EditorText(), editorWindows1252_);
+  runner_.Run(
+      VerbRunner::Input::open,
+      [&] { return AfterAsking(failures, selector_.SaveSettingsFile(text)); },
+      "The settings file could not be saved:",
+      [this](Outcome &outcome) {
+        if (!outcome.done)
+          return;
+        editorFile_ = selector_.SettingsFileText(outcome.failures);
+        IniRead();
+      });
 }
 
 // The editor's text as the player left it. Plain text would turn no-break spaces into blanks and
@@ -350,31 +331,18 @@ void MainWindow::FillMusicList(bool tell) {
 }
 
 void MainWindow::List4_Click(QListWidgetItem *item) {
-  Failures failures;
-  {
-    const InputBlocker blocker;
-    selector_.SwitchMusic(currentMusic_, item->data(Qt::UserRole).toByteArray().toStdString(),
-                          failures);
-  }
-  // What Music.ini holds was said at the start, not again at each switch.
-  FillMusicList(false);
-  ShowSummary();
-  ShowFailures(this, failures, "The music could not be switched:");
+  const std::string chosen = item->data(Qt::UserRole).toByteArray().toStdString();
+  runner_.Run(
+      VerbRunner::Input::blocked, [&] { return selector_.SwitchMusic(currentMusic_, chosen); },
+      "The music could not be switched:",
+      // What Music.ini holds was said at the start, not again at each switch.
+      [this](Outcome &) { FillMusicList(false); });
 }
 
 void MainWindow::delmsn_Click() {
-  Failures failures;
-  selector_.StartGame(failures);
-  ShowSummary();
-  ShowFailures(this, failures, "The game could not be started:");
-}
-
-// The line that sums up the last action takes the place of the instructions above the category
-// list until the next action; cut to the label's lines, whole in its tooltip.
-void MainWindow::ShowSummary() {
-  const QString summary = FromName(State().summary);
-  c_.Label22->setText(summary.isEmpty() ? QString(kInstructions) : FittedText(c_.Label22, summary));
-  c_.Label22->setToolTip(summary);
+  runner_.Run(
+      VerbRunner::Input::open, [this] { return selector_.StartGame(); },
+      "The game could not be started:");
 }
 
 void MainWindow::ShowGridRows() {

@@ -3,6 +3,7 @@
 #include "app/selector.h"
 #include "platform/qt_program_starter.h"
 #include "ui/held_key.h"
+#include "ui/verb_runner.h"
 #include "ui/window_caption.h"
 #include "ui/window_layout.h"
 
@@ -47,7 +48,6 @@ private:
   void List4_Click(QListWidgetItem *item);
   void delmsn_Click();
   void ShowScreenSize();
-  void ShowSummary();
   void ShowGridRows();
   void ShowGridChanges();
   void ShowSlotPanel();
@@ -59,6 +59,7 @@ private:
   QtProgramStarter starter_;
   Selector selector_;
   FolderGridModel *gridModel_;
+  VerbRunner runner_{this, c_.Label22};
   QString EditorText() const;
 
   bool editorWindows1252_ = false; // the eaw.ini editor's text came from Windows-1252 bytes

@@ -4,7 +4,6 @@
 #include "ui/event_hook.h"
 #include "ui/failure_box.h"
 #include "ui/folder_files_dialog.h"
-#include "ui/input_blocker.h"
 #include "ui/window_layout.h"
 
 #include <QClipboard>
@@ -39,8 +38,8 @@ void AskThen(QWidget *parent, const char *objectName, const QString &text,
 
 } // namespace
 
-SetupMenu::SetupMenu(Selector &selector, QTableView *grid, QWidget *window)
-    : QObject(window), selector_(selector), grid_(grid), window_(window) {
+SetupMenu::SetupMenu(Selector &selector, VerbRunner &runner, QTableView *grid, QWidget *window)
+    : QObject(window), selector_(selector), runner_(runner), grid_(grid), window_(window) {
   // A right-click reaches the grid's viewport, the menu key the grid itself.
   OnEvents(grid_->viewport(), [this](QEvent *event) {
     if (event->type() != QEvent::ContextMenu)
@@ -115,22 +114,19 @@ void SetupMenu::Save(const std::string &name) {
 }
 
 void SetupMenu::SaveNow(const std::string &name) {
-  Failures failures;
-  if (selector_.SaveSetup(name, failures))
-    emit Changed();
-  ShowFailures(window_, failures, "The setup could not be saved:");
+  runner_.Run(
+      VerbRunner::Input::open, [&] { return selector_.SaveSetup(name); },
+      "The setup could not be saved:",
+      [this](Outcome &outcome) {
+        if (outcome.done)
+          emit Changed();
+      });
 }
 
 void SetupMenu::Switch(const std::string &name) {
-  Failures failures;
-  std::string notice;
-  {
-    const InputBlocker blocker;
-    notice = selector_.SwitchToSetup(name, failures);
-  }
-  emit Changed();
-  ShowFailures(window_, failures, "The setup could not be used in full:");
-  ShowNotice(window_, notice);
+  runner_.Run(
+      VerbRunner::Input::blocked, [&] { return selector_.SwitchToSetup(name); },
+      "The setup could not be used in full:", [this](Outcome &) { emit Changed(); });
 }
 
 void SetupMenu::AskDelete(const std::string &name) {
@@ -138,9 +134,9 @@ void SetupMenu::AskDelete(const std::string &name) {
           "Delete the setup " + Quoted(name) +
               "? Only the list goes: no folder is loaded or unloaded.",
           [this, name] {
-            Failures failures;
-            selector_.DeleteSetup(name, failures);
-            ShowFailures(window_, failures, "The setup could not be deleted:");
+            runner_.Run(
+                VerbRunner::Input::open, [&] { return selector_.DeleteSetup(name); },
+                "The setup could not be deleted:");
           });
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "app/selector.h"
+#include "ui/verb_runner.h"
 
 #include <QObject>
 #include <QPoint>
@@ -16,10 +17,11 @@ class QMenu;
 class SetupMenu : public QObject {
   Q_OBJECT
 public:
-  SetupMenu(Selector &selector, QTableView *grid, QWidget *window);
+  // Verbs run through `runner`, which shows their outcome.
+  SetupMenu(Selector &selector, VerbRunner &runner, QTableView *grid, QWidget *window);
 
 signals:
-  // The loaded folders or the summary line changed: the window draws them again.
+  // The loaded folders may have changed: the window draws the grid again.
   void Changed();
 
 private:
@@ -34,6 +36,7 @@ private:
   void CopyLoadedNames();
 
   Selector &selector_;
+  VerbRunner &runner_;
   QTableView *grid_;
   QWidget *window_;
 };
