@@ -13,6 +13,7 @@
 #include <optional>
 #include <set>
 #include <system_error>
+#include <unordered_set>
 
 namespace fs = std::filesystem;
 
@@ -21,6 +22,8 @@ namespace {
 // One file of the folder being loaded and where it goes.
 struct Copy {
   fs::path source;
+  fs::path destination;
+  fs::path kept; // where the game's own file goes first, when the entry keeps it
   Journal::Entry entry;
   std::uint64_t bytes; // its size, for the progress
 };
@@ -37,13 +40,27 @@ std::optional<bool> OriginalKept(const fs::path &path) {
   return std::nullopt;
 }
 
+// The PlaceKey of every entry of the originals folders, listed once, so that only a name found
+// there is looked at alone.
+std::unordered_set<std::string> KeptEntries(const OriginalsFolders &originals) {
+  std::unordered_set<std::string> keys;
+  for (const Place place : {Place::Game, Place::Savedata, Place::Music}) {
+    std::error_code error;
+    for (fs::directory_iterator it(originals[static_cast<size_t>(place)], error), end;
+         !error && it != end; it.increment(error))
+      keys.insert(PlaceKey(place, NameText(it->path())));
+  }
+  return keys;
+}
+
 // The copies a load makes, with the game's own files among their targets marked to be kept;
 // notes in `overwritten` the loaded folders whose files it replaces.
 std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
                              const std::vector<std::string> &files, const Ledger &ledger,
                              GamePlaces &places, std::set<std::string> &overwritten,
                              Failures &failures) {
-  const fs::path keeping = KeepingFolder(state.LibDir);
+  const OriginalsFolders originals = AllOriginalsFolders(KeepingFolder(state.LibDir));
+  const std::unordered_set<std::string> keptEntries = KeptEntries(originals);
   const auto providers = ledger.LastProviders();
   std::vector<Copy> copies;
   for (const std::string &name : files) {
@@ -64,33 +81,40 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
     const PlacedFile target{place, index.TargetName(name)};
     const std::string key = PlaceKey(place, target.name);
     const auto provider = providers.find(key);
-    bool keep = false;
+    const fs::path &originalsFolder = originals[static_cast<size_t>(place)];
+    fs::path kept;
     // A copy this folder made before (a ledger out of step with the record) is no original, and
     // neither is a copy an unload could not delete.
     if (provider != providers.end() && provider->second != NameText(folder)) {
       overwritten.insert(provider->second);
     } else if (provider == providers.end() && !index.Matches(name).empty() &&
                !ledger.IsLeftover(key)) {
-      const std::optional<bool> kept = OriginalKept(OriginalPath(keeping, target));
-      if (!kept) {
+      kept = Child(originalsFolder, target.name);
+      const std::optional<bool> keptAlready =
+          keptEntries.count(key) > 0 ? OriginalKept(kept) : false;
+      if (!keptAlready) {
         failures.Add(source, "not copied: the place for the game's own file in " +
-                                 DisplayPath(OriginalsFolder(keeping, place)) +
+                                 DisplayPath(originalsFolder) +
                                  " is taken by something that is no file");
         continue;
       }
       // Two files would claim to be the game's own (a saved game played on after an older one
       // was kept): neither may be lost.
-      if (*kept) {
+      if (*keptAlready) {
         failures.Add(source, "not copied: the game's own file of that name is kept in " +
-                                 DisplayPath(OriginalsFolder(keeping, place)) +
+                                 DisplayPath(originalsFolder) +
                                  " already, and the game holds another one that would be lost");
         continue;
       }
-      keep = true;
     }
     std::error_code error;
     const std::uintmax_t bytes = fs::file_size(source, error);
-    copies.push_back({source, {target, keep}, error ? 0 : bytes});
+    const bool keep = !kept.empty();
+    copies.push_back({source,
+                      Child(places.Folder(place), target.name),
+                      std::move(kept),
+                      {target, keep},
+                      error ? 0 : bytes});
   }
   return copies;
 }
@@ -144,14 +168,12 @@ std::optional<std::vector<std::string>> MoveIn(LibraryState &state, const fs::pa
   for (const Copy &copy : copies) {
     const PlacedFile &target = copy.entry.file;
     meter.NextFile("Please wait- copying: :", target.name, copy.bytes);
-    const fs::path destination = Child(places.Folder(target.place), target.name);
     // The game's own file goes into safekeeping first; one that cannot is not overwritten.
-    if (copy.entry.keepOriginal &&
-        !MoveReplacing(destination, OriginalPath(keeping, target), failures))
+    if (copy.entry.keepOriginal && !MoveReplacing(copy.destination, copy.kept, failures))
       continue;
-    if (!CopyJournaled(copy.source, destination, failures, progress)) {
+    if (!CopyJournaled(copy.source, copy.destination, failures, progress)) {
       if (copy.entry.keepOriginal)
-        PutOriginalBack(OriginalPath(keeping, target), destination, failures);
+        PutOriginalBack(copy.kept, copy.destination, failures);
       continue;
     }
     loaded.files.push_back(target);
