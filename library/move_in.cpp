@@ -146,7 +146,7 @@ std::optional<std::vector<std::string>> MoveIn(LibraryState &state, const fs::pa
     return std::nullopt;
   }
   const std::vector<std::string> &files = listing.names;
-  GamePlaces places(state.EAWDir, files);
+  GamePlaces places(PlaceFoldersOf(state), files);
   std::set<std::string> overwritten;
   const std::vector<Copy> copies =
       PlanCopies(state, folder, files, ledger, places, overwritten, failures);

@@ -43,7 +43,7 @@ std::vector<FileStep> UnplaceFiles(LibraryState &state, const Ledger &ledger,
   const OriginalsFolders originals = AllOriginalsFolders(keeping);
   const auto providers = ledger.LastProviders();
   const std::unordered_set<std::string> kept = KeptOriginals(keeping);
-  GamePlaces places(state.EAWDir);
+  GamePlaces places(PlaceFoldersOf(state));
   std::vector<FileStep> leftovers;
   ProgressMeter meter(caption, static_cast<int>(entries.size()));
   for (const Journal::Entry &entry : entries) {
