@@ -86,7 +86,7 @@ TEST(Listing, ALargeFolderComesInTheSameOrder) {
     for (const char *stem : {"Addon ", "addon_", "ADDON-A", "b"})
       names.push_back(stem + std::to_string(i * 7 % 150) + ".dat");
   if (IsCaseSensitive(folder.Path()))
-    names.insert(names.end(), {"addon-a1.dat", "ADDON-A1.DAT", "Addon-A1.dat"});
+    names.insert(names.end(), {"addon-a1.dat", "ADDON-A1.DAT", "Addon-A1.dat", "b", "B"});
   for (const std::string &name : names)
     folder.Write(name);
   std::sort(names.begin(), names.end(),
