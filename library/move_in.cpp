@@ -21,11 +21,23 @@ namespace {
 
 // One file of the folder being loaded and where it goes.
 struct Copy {
-  fs::path source;
-  fs::path destination;
-  fs::path kept; // where the game's own file goes first, when the entry keeps it
+  std::string source; // its name in the folder
   Journal::Entry entry;
   std::uint64_t bytes; // its size, for the progress
+};
+
+// The paths of files in one folder, made by replacing the last part of one path: a new path for
+// each would split every part of the folder's path again, which costs more than a copy.
+class PathsIn {
+public:
+  explicit PathsIn(const fs::path &folder) : path_(Child(folder, "-")) {}
+  const fs::path &Of(std::string_view name) {
+    path_.replace_filename(Child({}, name));
+    return path_;
+  }
+
+private:
+  fs::path path_;
 };
 
 // Whether an original of that name is kept already at `path`; nothing when that cannot be told
@@ -63,11 +75,12 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
   const std::unordered_set<std::string> keptEntries = KeptEntries(originals);
   const auto providers = ledger.LastProviders();
   std::vector<Copy> copies;
+  PathsIn sources(folder);
   for (const std::string &name : files) {
     if (StaysInLibrary(name))
       continue;
     const Place place = PlaceOf(name);
-    const fs::path source = Child(folder, name);
+    const fs::path &source = sources.Of(name);
     // The ledger takes plain names only, so that no copy is made that an unload cannot find.
     if (const std::string problem = PlainNameProblem(name); !problem.empty()) {
       failures.Add(source, "was not loaded: it is " + problem);
@@ -82,16 +95,15 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
     const std::string key = PlaceKey(place, target.name);
     const auto provider = providers.find(key);
     const fs::path &originalsFolder = originals[static_cast<size_t>(place)];
-    fs::path kept;
+    bool keep = false;
     // A copy this folder made before (a ledger out of step with the record) is no original, and
     // neither is a copy an unload could not delete.
     if (provider != providers.end() && provider->second != NameText(folder)) {
       overwritten.insert(provider->second);
     } else if (provider == providers.end() && !index.Matches(name).empty() &&
                !ledger.IsLeftover(key)) {
-      kept = Child(originalsFolder, target.name);
       const std::optional<bool> keptAlready =
-          keptEntries.count(key) > 0 ? OriginalKept(kept) : false;
+          keptEntries.count(key) > 0 ? OriginalKept(Child(originalsFolder, target.name)) : false;
       if (!keptAlready) {
         failures.Add(source, "not copied: the place for the game's own file in " +
                                  DisplayPath(originalsFolder) +
@@ -106,15 +118,11 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
                                  " already, and the game holds another one that would be lost");
         continue;
       }
+      keep = true;
     }
     std::error_code error;
     const std::uintmax_t bytes = fs::file_size(source, error);
-    const bool keep = !kept.empty();
-    copies.push_back({source,
-                      Child(places.Folder(place), target.name),
-                      std::move(kept),
-                      {target, keep},
-                      error ? 0 : bytes});
+    copies.push_back({name, {target, keep}, error ? 0 : bytes});
   }
   return copies;
 }
@@ -165,15 +173,24 @@ std::optional<std::vector<std::string>> MoveIn(LibraryState &state, const fs::pa
     bytes += copy.bytes;
   ProgressMeter meter(caption, static_cast<int>(copies.size()), bytes);
   const CopyProgress progress = [&meter](std::uint64_t copied) { meter.Copied(copied); };
+  PathsIn sources(folder);
+  std::vector<PathsIn> destinations, originals;
+  for (const Place place : {Place::Game, Place::Savedata, Place::Music}) {
+    destinations.emplace_back(places.Folder(place));
+    originals.emplace_back(OriginalsFolder(keeping, place));
+  }
   for (const Copy &copy : copies) {
     const PlacedFile &target = copy.entry.file;
     meter.NextFile("Please wait- copying: :", target.name, copy.bytes);
+    const size_t at = static_cast<size_t>(target.place);
+    const fs::path &destination = destinations[at].Of(target.name);
+    const fs::path &kept = originals[at].Of(target.name);
     // The game's own file goes into safekeeping first; one that cannot is not overwritten.
-    if (copy.entry.keepOriginal && !MoveReplacing(copy.destination, copy.kept, failures))
+    if (copy.entry.keepOriginal && !MoveReplacing(destination, kept, failures))
       continue;
-    if (!CopyJournaled(copy.source, copy.destination, failures, progress)) {
+    if (!CopyJournaled(sources.Of(copy.source), destination, failures, progress)) {
       if (copy.entry.keepOriginal)
-        PutOriginalBack(copy.kept, copy.destination, failures);
+        PutOriginalBack(kept, destination, failures);
       continue;
     }
     loaded.files.push_back(target);
