@@ -21,9 +21,6 @@
 namespace fs = std::filesystem;
 
 #ifdef _WIN32
-// Hidden, system and archive cannot be told apart cheaply here: every file is made normal.
-static bool IsNormal(const fs::path &) { return false; }
-
 bool MakeNormal(const fs::path &path, Failures &failures) {
   // A link is replaced or deleted as it is; its attributes would be those of what it points at.
   if (IsLink(path) || SetFileAttributesW(path.c_str(), FILE_ATTRIBUTE_NORMAL))
@@ -33,11 +30,6 @@ bool MakeNormal(const fs::path &path, Failures &failures) {
   return false;
 }
 #else
-static bool IsNormal(const fs::path &path) {
-  std::error_code error;
-  return (fs::status(path, error).permissions() & fs::perms::owner_write) != fs::perms::none;
-}
-
 bool MakeNormal(const fs::path &path, Failures &failures) {
   return IsLink(path) || MakeWritable(path, failures);
 }
@@ -188,13 +180,13 @@ static void AddCopyFailure(const fs::path &source, const fs::path &target,
 // Copies `source` over `target` by way of a temporary file beside it, so that the target is
 // either the old file or the whole new one.
 static bool CopyOver(const fs::path &source, const fs::path &target, Failures &failures,
-                     const CopyProgress &progress) {
+                     const CopyProgress &progress, bool &sourceNormal) {
   const fs::path temporary = PartialPath(target);
-  std::error_code error = CopyToNewFile(source, temporary, progress);
+  std::error_code error = CopyToNewFile(source, temporary, progress, &sourceNormal);
   if (AlreadyExists(error)) {
     // What an interrupted copy left must not block this one.
     RemovePartial(temporary);
-    error = CopyToNewFile(source, temporary, progress);
+    error = CopyToNewFile(source, temporary, progress, &sourceNormal);
   }
   if (error) {
     AddCopyFailure(source, target, error, failures);
@@ -217,8 +209,9 @@ static bool CopyOver(const fs::path &source, const fs::path &target, Failures &f
 }
 
 // The copy carries the source's attributes, so a normal source leaves nothing to do.
-static void MakeBothNormal(const fs::path &source, const fs::path &target, Failures &failures) {
-  if (!IsNormal(source)) {
+static void MakeBothNormal(const fs::path &source, const fs::path &target, bool sourceNormal,
+                           Failures &failures) {
+  if (!sourceNormal) {
     MakeNormal(source, failures);
     MakeNormal(target, failures);
   }
@@ -226,23 +219,25 @@ static void MakeBothNormal(const fs::path &source, const fs::path &target, Failu
 
 bool CopyReplacing(const fs::path &source, const fs::path &target, Failures &failures,
                    const CopyProgress &progress) {
-  if (!CopyOver(source, target, failures, progress))
+  bool sourceNormal = false;
+  if (!CopyOver(source, target, failures, progress, sourceNormal))
     return false;
-  MakeBothNormal(source, target, failures);
+  MakeBothNormal(source, target, sourceNormal, failures);
   return true;
 }
 
 bool CopyJournaled(const fs::path &source, const fs::path &target, Failures &failures,
                    const CopyProgress &progress) {
   // Only a file to replace needs the temporary, which costs a rename per file.
-  const std::error_code error = CopyToNewFile(source, target, progress);
+  bool sourceNormal = false;
+  const std::error_code error = CopyToNewFile(source, target, progress, &sourceNormal);
   if (AlreadyExists(error))
     return CopyReplacing(source, target, failures, progress);
   if (error) {
     AddCopyFailure(source, target, error, failures);
     return false;
   }
-  MakeBothNormal(source, target, failures);
+  MakeBothNormal(source, target, sourceNormal, failures);
   StepDone();
   return true;
 }

@@ -3,7 +3,7 @@
 #include "base/names.h"
 
 #include <algorithm>
-#include <numeric>
+#include <array>
 #include <system_error>
 
 #ifdef _WIN32
@@ -161,30 +161,81 @@ std::error_code ForEachEntry(const fs::path &folder,
 }
 #endif
 
-// Sorts as NameLess does, with each name's upper-case form made once, in one buffer, so that the
-// comparisons of a large folder compare bytes rather than fold them anew each time.
+// A name to sort: its upper-case form (see Upper) and where it is in the listing.
+struct SortEntry {
+  std::string_view key;
+  size_t index;
+};
+
+// How many entries a bucket must hold to be split by its next byte rather than compared.
+constexpr size_t kRadixMinimum = 64;
+
+// Sorts `entries`, whose keys agree on their first `depth` bytes, by key and then by name: one
+// pass per byte splits them into buckets, so that a large folder's names, which share long
+// beginnings, are not compared from their first byte again and again.
+void SortByKey(SortEntry *entries, size_t count, size_t depth, std::vector<SortEntry> &spare,
+               const std::vector<std::string> &names) {
+  const auto less = [&](const SortEntry &a, const SortEntry &b) {
+    const int keyOrder = a.key.compare(b.key);
+    return keyOrder != 0 ? keyOrder < 0 : names[a.index] < names[b.index];
+  };
+  if (count < kRadixMinimum) {
+    std::sort(entries, entries + count, less);
+    return;
+  }
+  // The bytes that all keys share need no pass of their own.
+  const std::string_view first = entries[0].key;
+  size_t shared = first.size();
+  for (size_t i = 1; i < count && shared > depth; ++i) {
+    const std::string_view key = entries[i].key;
+    size_t at = depth;
+    while (at < shared && at < key.size() && key[at] == first[at])
+      ++at;
+    shared = at;
+  }
+  depth = shared;
+  // Bucket 0 holds the keys that end here; bucket 1 + b those whose next byte is b.
+  const auto bucket = [depth](const SortEntry &entry) -> size_t {
+    return entry.key.size() == depth ? 0 : 1 + static_cast<unsigned char>(entry.key[depth]);
+  };
+  std::array<size_t, 258> starts{};
+  for (size_t i = 0; i < count; ++i)
+    ++starts[bucket(entries[i]) + 1];
+  for (size_t b = 1; b < starts.size(); ++b)
+    starts[b] += starts[b - 1];
+  spare.assign(entries, entries + count);
+  std::array<size_t, 258> next = starts;
+  for (const SortEntry &entry : spare)
+    entries[next[bucket(entry)]++] = entry;
+  // Keys that end here are equal: the names decide.
+  std::sort(entries, entries + starts[1], less);
+  for (size_t b = 1; b + 1 < starts.size(); ++b)
+    if (starts[b + 1] - starts[b] > 1)
+      SortByKey(entries + starts[b], starts[b + 1] - starts[b], depth + 1, spare, names);
+}
+
+// Sorts as NameLess does, with each name's upper-case form made once, in one buffer.
 void SortNames(std::vector<std::string> &names) {
   std::string keys;
-  std::vector<size_t> starts;
-  starts.reserve(names.size() + 1);
-  for (const std::string &name : names) {
-    starts.push_back(keys.size());
+  size_t bytes = 0;
+  for (const std::string &name : names)
+    bytes += name.size();
+  keys.reserve(bytes);
+  for (const std::string &name : names)
     keys += Upper(name);
+  std::vector<SortEntry> order;
+  order.reserve(names.size());
+  size_t start = 0;
+  for (size_t i = 0; i < names.size(); ++i) {
+    order.push_back({std::string_view(keys).substr(start, names[i].size()), i});
+    start += names[i].size();
   }
-  starts.push_back(keys.size());
-  const auto key = [&](size_t i) {
-    return std::string_view(keys).substr(starts[i], starts[i + 1] - starts[i]);
-  };
-  std::vector<size_t> order(names.size());
-  std::iota(order.begin(), order.end(), size_t{0});
-  std::sort(order.begin(), order.end(), [&](size_t a, size_t b) {
-    const int keyOrder = key(a).compare(key(b));
-    return keyOrder != 0 ? keyOrder < 0 : names[a] < names[b];
-  });
+  std::vector<SortEntry> spare;
+  SortByKey(order.data(), order.size(), 0, spare, names);
   std::vector<std::string> sorted;
   sorted.reserve(names.size());
-  for (const size_t i : order)
-    sorted.push_back(std::move(names[i]));
+  for (const SortEntry &entry : order)
+    sorted.push_back(std::move(names[entry.index]));
   names.swap(sorted);
 }
 

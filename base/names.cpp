@@ -28,7 +28,12 @@ fs::path Child(const fs::path &folder, std::string_view name) {
 #ifdef _WIN32
   return folder / fs::u8path(name.begin(), name.end());
 #else
-  return folder / fs::path(std::string(name));
+  // One string and one parse: appending a path copies every component of the folder's.
+  std::string text = folder.native();
+  if (!text.empty() && text.back() != '/')
+    text += '/';
+  text += name;
+  return fs::path(std::move(text));
 #endif
 }
 

@@ -60,7 +60,7 @@ static DWORD CALLBACK ReportCopied(LARGE_INTEGER size, LARGE_INTEGER copied, LAR
 }
 
 std::error_code CopyToNewFile(const fs::path &source, const fs::path &path,
-                              const CopyProgress &progress) {
+                              const CopyProgress &progress, [[maybe_unused]] bool *sourceNormal) {
   if (IsLink(source))
     return LinkError();
   // Asked first, so that what a failed copy leaves behind is surely its own to delete.
@@ -202,7 +202,7 @@ static bool CopyContent(int in, int out, off_t size, const CopyProgress &progres
 }
 
 std::error_code CopyToNewFile(const fs::path &source, const fs::path &path,
-                              const CopyProgress &progress) {
+                              const CopyProgress &progress, bool *sourceNormal) {
   const int in = ::open(source.c_str(), O_RDONLY | O_NOFOLLOW | O_CLOEXEC);
   if (in < 0)
     return errno == ELOOP ? std::make_error_code(std::errc::too_many_symbolic_link_levels)
@@ -214,6 +214,8 @@ std::error_code CopyToNewFile(const fs::path &source, const fs::path &path,
     ::close(in);
     return error;
   }
+  if (sourceNormal)
+    *sourceNormal = (info.st_mode & S_IWUSR) != 0;
   const int out = CreateNew(path);
   if (out < 0) {
     const std::error_code error = LastError();

@@ -16,9 +16,12 @@ using CopyProgress = std::function<void(std::uint64_t copied)>;
 // Copies the file `source` into the new file `path`, created the same way; a source that is a link
 // is refused. A file larger than a chunk is copied chunk by chunk, and `progress` (when set) is
 // told after each chunk but the last. Returns the error when that fails; a file it created is then
-// deleted again, so that nothing half-written stays.
+// deleted again, so that nothing half-written stays. `sourceNormal`, when given, is set to
+// whether the source is writable and needs no change of attributes (on Windows it stays false:
+// every file is made normal there).
 std::error_code CopyToNewFile(const std::filesystem::path &source,
-                              const std::filesystem::path &path, const CopyProgress &progress = {});
+                              const std::filesystem::path &path, const CopyProgress &progress = {},
+                              bool *sourceNormal = nullptr);
 #ifndef _WIN32
 // How CopyToNewFile moved the bytes of its last copy on this thread: by copy_file_range, which
 // clones blocks where the file system can, or by sendfile or reads and writes where that was

@@ -166,6 +166,9 @@ std::string NameFromText(std::string_view bytes) {
 FirstCharacter FirstCharacterOf(std::string_view name) {
   if (name.empty())
     return {"", 0};
+  // An ASCII byte is that character either way, without checking the rest of the name.
+  if (static_cast<unsigned char>(name.front()) < 0x80)
+    return {std::string(1, name.front()), 1};
   size_t at = 0;
   char32_t c = 0;
   if (IsUtf8(name) && NextCodePoint(name, at, c))

@@ -341,10 +341,16 @@ void BenchCloneLoad(const fs::path &root, int pairs) {
   StopOnFailures(failures);
 }
 
-void BenchFileWork(const fs::path &root, int pairs) {
-  BenchLoadInWindow(root, pairs);
-  BenchLoads(root, pairs);
-  BenchLoadKeepingOriginals(root, pairs);
-  BenchUnloads(root, pairs);
-  BenchResetAll(root, pairs);
+void BenchFileWork(const fs::path &root, int pairs, const std::string &only) {
+  const auto wanted = [&](const char *lines) { return only == "files" || only == lines; };
+  if (wanted("window"))
+    BenchLoadInWindow(root, pairs);
+  if (wanted("loads"))
+    BenchLoads(root, pairs);
+  if (wanted("keeping"))
+    BenchLoadKeepingOriginals(root, pairs);
+  if (wanted("unloads"))
+    BenchUnloads(root, pairs);
+  if (wanted("reset"))
+    BenchResetAll(root, pairs);
 }

@@ -1,8 +1,9 @@
 // Measures the program's file work and start-up as ratios against plain baselines in paired
 // rounds, on tmpfs when the machine has one and on the temporary folder's own file system.
-// Usage: selector_bench [pairs [files | setups | startup | clone <folder>]]   (at least 9; 9 when
-// not given; "files", "setups" or "startup" runs only those lines, "clone" only the load of big
-// files in <folder>, which scripts/bench_reflink.sh mounts). It starts itself with
+// Usage: selector_bench [pairs [files | window | loads | keeping | unloads | reset | setups |
+// startup | clone <folder>]]   (at least 3; 9 when not given; a word runs only those lines,
+// "clone" only the load of big files in <folder>, which scripts/bench_reflink.sh mounts). It starts
+// itself with
 // "--show-window <game folder>" for each timed start-up.
 
 #include "bench/file_work.h"
@@ -75,7 +76,7 @@ int main(int argc, char **argv) {
   if (argc == 3 && std::string(argv[1]) == "--show-window")
     return ShowWindowAndEnd(argv[2], argc, argv);
   QApplication app(argc, argv);
-  const int pairs = std::max(9, argc > 1 ? std::atoi(argv[1]) : 9);
+  const int pairs = std::max(3, argc > 1 ? std::atoi(argv[1]) : 9);
   DescribeMachine();
   if (argc == 4 && std::string(argv[2]) == "clone") {
     const fs::path root = fs::path(argv[3]) / ("selector-bench-" + std::to_string(::getpid()));
@@ -92,8 +93,8 @@ int main(int argc, char **argv) {
     PrintHeading("== " + base.string() + " (" + MountOf(base) + "), " + std::to_string(pairs) +
                  " pairs ==");
     const std::string only = argc > 2 ? argv[2] : "";
-    if (only.empty() || only == "files")
-      BenchFileWork(root, pairs);
+    if (only != "setups" && only != "startup")
+      BenchFileWork(root, pairs, only.empty() ? "files" : only);
     if (only.empty() || only == "setups")
       BenchSetups(root, pairs);
     if (only.empty() || only == "startup")

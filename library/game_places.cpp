@@ -18,6 +18,50 @@ fs::path PlaceFolder(const fs::path &eawDir, Place place) {
   return eawDir;
 }
 
+PlaceFolders FindPlaceFolders(const fs::path &eawDir) {
+  PlaceFolders folders;
+  folders[static_cast<size_t>(Place::Game)] = eawDir;
+  std::vector<std::pair<Place, std::string>> missing;
+  for (const auto &[place, name] :
+       {std::pair{Place::Savedata, "Savedata"}, {Place::Music, "Music"}}) {
+    fs::path &folder = folders[static_cast<size_t>(place)];
+    folder = Child(eawDir, name);
+    std::error_code error;
+    if (!fs::exists(folder, error))
+      missing.emplace_back(place, FoldName(name));
+  }
+  if (missing.empty())
+    return folders;
+  std::error_code error;
+  for (fs::directory_iterator it(eawDir, error), end; !error && it != end && !missing.empty();
+       it.increment(error)) {
+    const std::string folded = FoldName(NameText(it->path()));
+    // The first entry found of each name, as FindAnyCase takes it.
+    for (auto wanted = missing.begin(); wanted != missing.end();)
+      if (folded == wanted->second) {
+        folders[static_cast<size_t>(wanted->first)] = it->path();
+        wanted = missing.erase(wanted);
+      } else {
+        ++wanted;
+      }
+  }
+  return folders;
+}
+
+PlaceFolders PlaceFoldersOf(const LibraryState &state) {
+  return state.places ? *state.places : FindPlaceFolders(state.EAWDir);
+}
+
+PlacesScope::PlacesScope(LibraryState &state) : state_(state), outermost_(!state.places) {
+  if (outermost_)
+    state_.places = FindPlaceFolders(state_.EAWDir);
+}
+
+PlacesScope::~PlacesScope() {
+  if (outermost_)
+    state_.places.reset();
+}
+
 bool EnsurePlaceFolder(const fs::path &folder, Failures &failures) {
   std::error_code error;
   if (fs::is_directory(folder, error))
@@ -29,6 +73,12 @@ bool EnsurePlaceFolder(const fs::path &folder, Failures &failures) {
   failures.Add(folder, "cannot be created (" +
                            (error ? error.message() : std::string("a file is in the way")) + ")");
   return false;
+}
+
+GamePlaces::GamePlaces(const PlaceFolders &folders, std::vector<std::string> names)
+    : eawDir_(folders[static_cast<size_t>(Place::Game)]), names_(std::move(names)) {
+  for (const Place place : {Place::Game, Place::Savedata, Place::Music})
+    At(place).folder = folders[static_cast<size_t>(place)];
 }
 
 const fs::path &GamePlaces::Folder(Place place) {

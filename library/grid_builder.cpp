@@ -10,9 +10,13 @@
 namespace fs = std::filesystem;
 
 bool IsReservedFolder(std::string_view name) {
-  const std::string upper = Upper(name);
-  return upper == "AUTOSCRIPTS" || upper == "SKINFOLDER" || upper == "UNUSED" ||
-         upper == Upper(kKeepingFolder);
+  // Only a name of a reserved one's length is folded: a large library has few such.
+  static constexpr std::string_view kReserved[] = {"AUTOSCRIPTS", "SKINFOLDER", "UNUSED",
+                                                   kKeepingFolder};
+  for (const std::string_view reserved : kReserved)
+    if (name.size() == reserved.size() && Upper(name) == Upper(reserved))
+      return true;
+  return false;
 }
 
 void BuildFolderRows(FolderGrid &grid, const std::vector<std::string> &codes,

@@ -3,12 +3,15 @@
 #include "base/existence.h"
 #include "base/new_file.h"
 #include "base/text_encoding.h"
+#include "library/game_places.h"
 #include "library/keeping.h"
 #include "library/kept_links.h"
 #include "library/loaded_record.h"
 #include "library/move_in.h"
 #include "library/move_out.h"
 #include "slots/slot_grid.h"
+
+#include <optional>
 
 namespace fs = std::filesystem;
 
@@ -36,8 +39,10 @@ int LastLoaded(const FolderGrid &grid, const std::string &letter) {
 // that were can still be unloaded. Returns the loaded folders whose files it replaced.
 std::vector<std::string> Load(LibraryState &state, int row, Caption &caption, Failures &failures) {
   const size_t before = failures.Lines().size();
+  // Replaying the record copies nothing: no path is made for each of its folders.
   const std::optional<std::vector<std::string>> overwritten =
-      MoveIn(state, state.Unigrid.PathOf(row), caption, failures);
+      state.Ready ? MoveIn(state, state.Unigrid.PathOf(row), caption, failures)
+                  : std::vector<std::string>{};
   // A folder that was not loaded at all is not marked: there is nothing to unload.
   if (!overwritten)
     return {};
@@ -112,6 +117,10 @@ std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption
   state.Unigrid.currentRow = row;
   if (!state.Unigrid.IsFolderRow(row))
     return {};
+  // Found once for the click; replaying the record touches no file and needs none.
+  std::optional<PlacesScope> places;
+  if (state.Ready)
+    places.emplace(state);
   const GridRow &clicked = state.Unigrid.Row(row);
   if (!IsLoaded(clicked)) {
     const fs::path folder = state.Unigrid.PathOf(row);

@@ -34,9 +34,16 @@ bool Storable(std::string_view name) {
   return !name.empty() && name.front() != '\t' && name.find_first_of("\r\n") == name.npos;
 }
 
-// A file line: a tab, the place letter, the keep mark and the name.
-std::string FileLine(const PlacedFile &file, char mark) {
-  return std::string("\t") + PlaceLetter(file.place) + mark + file.name;
+// Appends a file line to `text`: a tab, the place letter, the keep mark, the name and the line
+// end; a name that no line can hold is left out.
+void AppendFileLine(std::string &text, const PlacedFile &file, char mark) {
+  if (!Storable(file.name))
+    return;
+  text += '\t';
+  text += PlaceLetter(file.place);
+  text += mark;
+  text += file.name;
+  text += "\r\n";
 }
 
 // A file line of the ledger or the journal, and its mark.
@@ -71,15 +78,22 @@ fs::path OriginalsFolder(const fs::path &keeping, Place place) {
   return keeping / "originals" / std::string(1, PlaceLetter(place));
 }
 
+OriginalsFolders AllOriginalsFolders(const fs::path &keeping) {
+  OriginalsFolders folders;
+  for (const Place place : {Place::Game, Place::Savedata, Place::Music})
+    folders[static_cast<size_t>(place)] = OriginalsFolder(keeping, place);
+  return folders;
+}
+
 fs::path OriginalPath(const fs::path &keeping, const PlacedFile &file) {
   return Child(OriginalsFolder(keeping, file.place), file.name);
 }
 
 Ledger Ledger::Read(const fs::path &keeping, Failures &failures) {
   Ledger ledger;
-  RemovePartial(PartialPath(keeping / kLedgerFile));
-  const auto lines =
-      ReadLinesIfExists(keeping / kLedgerFile, failures, Encoding::Bytes, kMaxKeepingBytes);
+  const fs::path path = keeping / kLedgerFile;
+  RemovePartial(PartialPath(path));
+  const auto lines = ReadLinesIfExists(path, failures, Encoding::Bytes, kMaxKeepingBytes);
   if (!lines)
     return ledger;
   // The lines of a refused folder belong to no folder.
@@ -87,14 +101,14 @@ Ledger Ledger::Read(const fs::path &keeping, Failures &failures) {
   for (size_t at = 0; at < lines->size(); ++at) {
     const std::string &line = (*lines)[at];
     if (const std::optional<FileLineParts> parts = ParseFileLine(line)) {
-      if (!AcceptPlainName(parts->file.name, keeping / kLedgerFile, at + 1, failures))
+      if (!AcceptPlainName(parts->file.name, path, at + 1, failures))
         continue;
       if (parts->mark == kLeftoverMark || parts->mark == kLeftoverOverOriginalMark)
         ledger.leftovers_.push_back({parts->file, parts->mark == kLeftoverOverOriginalMark});
       else if (inFolder)
         ledger.folders_.back().files.push_back(parts->file);
     } else if (Storable(line)) {
-      inFolder = AcceptPlainName(line, keeping / kLedgerFile, at + 1, failures);
+      inFolder = AcceptPlainName(line, path, at + 1, failures);
       if (inFolder)
         ledger.folders_.push_back({line, {}});
     }
@@ -106,17 +120,14 @@ bool Ledger::Write(const fs::path &keeping, Failures &failures) const {
   std::string text;
   // Before the first folder line, so that they belong to no folder.
   for (const FileStep &leftover : leftovers_)
-    if (Storable(leftover.file.name))
-      text += FileLine(leftover.file,
-                       leftover.keepOriginal ? kLeftoverOverOriginalMark : kLeftoverMark) +
-              "\r\n";
+    AppendFileLine(text, leftover.file,
+                   leftover.keepOriginal ? kLeftoverOverOriginalMark : kLeftoverMark);
   for (const LoadedFolder &folder : folders_) {
     if (!Storable(folder.name))
       continue;
     text += folder.name + "\r\n";
     for (const PlacedFile &file : folder.files)
-      if (Storable(file.name))
-        text += FileLine(file, ' ') + "\r\n";
+      AppendFileLine(text, file, ' ');
   }
   std::error_code error;
   fs::create_directories(keeping, error);
@@ -181,8 +192,7 @@ std::optional<Journal> Journal::Read(const fs::path &keeping, Failures &failures
 bool Journal::Write(const fs::path &keeping, Failures &failures) const {
   std::string text = std::string(kSteps[static_cast<size_t>(step)]) + "\r\n" + folder + "\r\n";
   for (const Entry &entry : entries)
-    if (Storable(entry.file.name))
-      text += FileLine(entry.file, entry.keepOriginal ? '+' : '-') + "\r\n";
+    AppendFileLine(text, entry.file, entry.keepOriginal ? '+' : '-');
   std::error_code error;
   fs::create_directories(keeping, error);
   return WriteAtomically(keeping / kJournalFile, text, failures);
@@ -204,10 +214,14 @@ void Journal::Remove(const fs::path &keeping) {
 
 bool MoveReplacing(const fs::path &from, const fs::path &to, Failures &failures) {
   std::error_code error;
-  fs::create_directories(to.parent_path(), error);
-  if (fs::exists(to, error))
-    MakeWritable(to, failures);
+  // Mostly the folder is there and nothing is in the way: one rename, and checks only when not.
   fs::rename(from, to, error);
+  if (error) {
+    fs::create_directories(to.parent_path(), error);
+    if (fs::exists(to, error))
+      MakeWritable(to, failures);
+    fs::rename(from, to, error);
+  }
   if (!error) {
     StepDone();
     return true;

@@ -3,6 +3,7 @@
 #include "base/failures.h"
 #include "library/file_rules.h"
 
+#include <array>
 #include <filesystem>
 #include <optional>
 #include <string>
@@ -89,6 +90,10 @@ struct Journal {
 std::filesystem::path KeepingFolder(const std::filesystem::path &libDir);
 // The folder in which the originals of `place` are kept.
 std::filesystem::path OriginalsFolder(const std::filesystem::path &keeping, Place place);
+// The originals folder of each place, for an operation that names many files: a path costs
+// more to build than a rename.
+using OriginalsFolders = std::array<std::filesystem::path, kPlaceCount>;
+OriginalsFolders AllOriginalsFolders(const std::filesystem::path &keeping);
 // Where the original of `file` is kept.
 std::filesystem::path OriginalPath(const std::filesystem::path &keeping, const PlacedFile &file);
 // Moves `from` to `to`, replacing `to`: a rename, or a copy and a delete across disks. False, with

@@ -14,8 +14,9 @@ bool RefusedForLink(const LibraryState &state, const fs::path &addon,
   std::vector<fs::path> folders = {keeping, keeping / "originals"};
   for (const Place place : {Place::Game, Place::Savedata, Place::Music})
     folders.push_back(OriginalsFolder(keeping, place));
-  folders.push_back(PlaceFolder(state.EAWDir, Place::Savedata));
-  folders.push_back(PlaceFolder(state.EAWDir, Place::Music));
+  const PlaceFolders places = PlaceFoldersOf(state);
+  folders.push_back(places[static_cast<size_t>(Place::Savedata)]);
+  folders.push_back(places[static_cast<size_t>(Place::Music)]);
   if (!addon.empty())
     folders.push_back(addon);
   for (const fs::path &folder : folders) {

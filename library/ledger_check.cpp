@@ -15,6 +15,7 @@
 
 #include <algorithm>
 #include <set>
+#include <unordered_set>
 
 namespace fs = std::filesystem;
 
@@ -68,12 +69,15 @@ void FollowLedger(const LibraryState &state, const Ledger &ledger,
   std::vector<std::string> loaded;
   for (const LoadedFolder &folder : ledger.Folders())
     loaded.push_back(folder.name);
-  const std::set<std::string> inLedger(loaded.begin(), loaded.end());
-  std::set<std::string> inRecord;
+  // Hashed, for thousands of loaded folders; ordered only for the message when they differ.
+  const std::unordered_set<std::string> hashedLedger(loaded.begin(), loaded.end());
+  std::unordered_set<std::string> hashedRecord;
   for (const std::string &line : recorded)
-    inRecord.insert(inLedger.count(line) ? line : TextAsUtf8(line));
-  if (inRecord == inLedger)
+    hashedRecord.insert(hashedLedger.count(line) ? line : TextAsUtf8(line));
+  if (hashedRecord == hashedLedger)
     return;
+  const std::set<std::string> inLedger(loaded.begin(), loaded.end());
+  const std::set<std::string> inRecord(hashedRecord.begin(), hashedRecord.end());
   std::vector<std::string> added, dropped;
   std::set_difference(inLedger.begin(), inLedger.end(), inRecord.begin(), inRecord.end(),
                       std::back_inserter(added));
@@ -108,7 +112,7 @@ void MendRecordFromLedger(LibraryState &state, Caption &caption, Failures &failu
   Ledger ledger = Ledger::Read(keeping, failures);
   // A Reset All cut short while it carried a campaign's saved games home has no journal yet.
   for (const LoadedFolder &folder : ledger.Folders())
-    if (IsCampaignFolder(Child(state.LibDir, folder.name)))
+    if (IsCampaignName(folder.name))
       RemoveHalfCarried(Child(state.LibDir, folder.name));
   if (RetryLeftovers(state, ledger, caption, failures))
     ledger.Write(keeping, failures);

@@ -1,9 +1,12 @@
 #pragma once
 
+#include "library/file_rules.h"
 #include "library/folder_grid.h"
 #include "slots/slot_table.h"
 
+#include <array>
 #include <filesystem>
+#include <optional>
 
 // What the last operation did to the game's files, for the line that sums it up.
 struct Tally {
@@ -20,6 +23,8 @@ struct LibraryState {
   FolderGrid Unigrid;
   SlotPanel Slots;
   Tally tally;
+  // The game's place folders as found once for the operation under way (see PlacesScope).
+  std::optional<std::array<std::filesystem::path, kPlaceCount>> places;
 };
 
 // The library state for the game folder `eawDir`, with `LibDir` (its "ZEP128" in any case).

@@ -13,6 +13,7 @@
 #include <optional>
 #include <set>
 #include <system_error>
+#include <unordered_set>
 
 namespace fs = std::filesystem;
 
@@ -20,9 +21,23 @@ namespace {
 
 // One file of the folder being loaded and where it goes.
 struct Copy {
-  fs::path source;
+  std::string source; // its name in the folder
   Journal::Entry entry;
   std::uint64_t bytes; // its size, for the progress
+};
+
+// The paths of files in one folder, made by replacing the last part of one path: a new path for
+// each would split every part of the folder's path again, which costs more than a copy.
+class PathsIn {
+public:
+  explicit PathsIn(const fs::path &folder) : path_(Child(folder, "-")) {}
+  const fs::path &Of(std::string_view name) {
+    path_.replace_filename(Child({}, name));
+    return path_;
+  }
+
+private:
+  fs::path path_;
 };
 
 // Whether an original of that name is kept already at `path`; nothing when that cannot be told
@@ -37,20 +52,35 @@ std::optional<bool> OriginalKept(const fs::path &path) {
   return std::nullopt;
 }
 
+// The PlaceKey of every entry of the originals folders, listed once, so that only a name found
+// there is looked at alone.
+std::unordered_set<std::string> KeptEntries(const OriginalsFolders &originals) {
+  std::unordered_set<std::string> keys;
+  for (const Place place : {Place::Game, Place::Savedata, Place::Music}) {
+    std::error_code error;
+    for (fs::directory_iterator it(originals[static_cast<size_t>(place)], error), end;
+         !error && it != end; it.increment(error))
+      keys.insert(PlaceKey(place, NameText(it->path())));
+  }
+  return keys;
+}
+
 // The copies a load makes, with the game's own files among their targets marked to be kept;
 // notes in `overwritten` the loaded folders whose files it replaces.
 std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
                              const std::vector<std::string> &files, const Ledger &ledger,
                              GamePlaces &places, std::set<std::string> &overwritten,
                              Failures &failures) {
-  const fs::path keeping = KeepingFolder(state.LibDir);
+  const OriginalsFolders originals = AllOriginalsFolders(KeepingFolder(state.LibDir));
+  const std::unordered_set<std::string> keptEntries = KeptEntries(originals);
   const auto providers = ledger.LastProviders();
   std::vector<Copy> copies;
+  PathsIn sources(folder);
   for (const std::string &name : files) {
     if (StaysInLibrary(name))
       continue;
     const Place place = PlaceOf(name);
-    const fs::path source = Child(folder, name);
+    const fs::path &source = sources.Of(name);
     // The ledger takes plain names only, so that no copy is made that an unload cannot find.
     if (const std::string problem = PlainNameProblem(name); !problem.empty()) {
       failures.Add(source, "was not loaded: it is " + problem);
@@ -64,6 +94,7 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
     const PlacedFile target{place, index.TargetName(name)};
     const std::string key = PlaceKey(place, target.name);
     const auto provider = providers.find(key);
+    const fs::path &originalsFolder = originals[static_cast<size_t>(place)];
     bool keep = false;
     // A copy this folder made before (a ledger out of step with the record) is no original, and
     // neither is a copy an unload could not delete.
@@ -71,18 +102,19 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
       overwritten.insert(provider->second);
     } else if (provider == providers.end() && !index.Matches(name).empty() &&
                !ledger.IsLeftover(key)) {
-      const std::optional<bool> kept = OriginalKept(OriginalPath(keeping, target));
-      if (!kept) {
+      const std::optional<bool> keptAlready =
+          keptEntries.count(key) > 0 ? OriginalKept(Child(originalsFolder, target.name)) : false;
+      if (!keptAlready) {
         failures.Add(source, "not copied: the place for the game's own file in " +
-                                 DisplayPath(OriginalsFolder(keeping, place)) +
+                                 DisplayPath(originalsFolder) +
                                  " is taken by something that is no file");
         continue;
       }
       // Two files would claim to be the game's own (a saved game played on after an older one
       // was kept): neither may be lost.
-      if (*kept) {
+      if (*keptAlready) {
         failures.Add(source, "not copied: the game's own file of that name is kept in " +
-                                 DisplayPath(OriginalsFolder(keeping, place)) +
+                                 DisplayPath(originalsFolder) +
                                  " already, and the game holds another one that would be lost");
         continue;
       }
@@ -90,7 +122,7 @@ std::vector<Copy> PlanCopies(const LibraryState &state, const fs::path &folder,
     }
     std::error_code error;
     const std::uintmax_t bytes = fs::file_size(source, error);
-    copies.push_back({source, {target, keep}, error ? 0 : bytes});
+    copies.push_back({name, {target, keep}, error ? 0 : bytes});
   }
   return copies;
 }
@@ -122,7 +154,7 @@ std::optional<std::vector<std::string>> MoveIn(LibraryState &state, const fs::pa
     return std::nullopt;
   }
   const std::vector<std::string> &files = listing.names;
-  GamePlaces places(state.EAWDir, files);
+  GamePlaces places(PlaceFoldersOf(state), files);
   std::set<std::string> overwritten;
   const std::vector<Copy> copies =
       PlanCopies(state, folder, files, ledger, places, overwritten, failures);
@@ -141,17 +173,24 @@ std::optional<std::vector<std::string>> MoveIn(LibraryState &state, const fs::pa
     bytes += copy.bytes;
   ProgressMeter meter(caption, static_cast<int>(copies.size()), bytes);
   const CopyProgress progress = [&meter](std::uint64_t copied) { meter.Copied(copied); };
+  PathsIn sources(folder);
+  std::vector<PathsIn> destinations, originals;
+  for (const Place place : {Place::Game, Place::Savedata, Place::Music}) {
+    destinations.emplace_back(places.Folder(place));
+    originals.emplace_back(OriginalsFolder(keeping, place));
+  }
   for (const Copy &copy : copies) {
     const PlacedFile &target = copy.entry.file;
     meter.NextFile("Please wait- copying: :", target.name, copy.bytes);
-    const fs::path destination = Child(places.Folder(target.place), target.name);
+    const size_t at = static_cast<size_t>(target.place);
+    const fs::path &destination = destinations[at].Of(target.name);
+    const fs::path &kept = originals[at].Of(target.name);
     // The game's own file goes into safekeeping first; one that cannot is not overwritten.
-    if (copy.entry.keepOriginal &&
-        !MoveReplacing(destination, OriginalPath(keeping, target), failures))
+    if (copy.entry.keepOriginal && !MoveReplacing(destination, kept, failures))
       continue;
-    if (!CopyJournaled(copy.source, destination, failures, progress)) {
+    if (!CopyJournaled(sources.Of(copy.source), destination, failures, progress)) {
       if (copy.entry.keepOriginal)
-        PutOriginalBack(OriginalPath(keeping, target), destination, failures);
+        PutOriginalBack(kept, destination, failures);
       continue;
     }
     loaded.files.push_back(target);

@@ -73,7 +73,7 @@ int LoadedFileCount(const LibraryState &state, Failures &failures) {
 
 void RestoreOriginals(LibraryState &state, Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
-  GamePlaces places(state.EAWDir);
+  GamePlaces places(PlaceFoldersOf(state));
   for (const Place place : {Place::Game, Place::Savedata, Place::Music}) {
     const fs::path kept = OriginalsFolder(keeping, place);
     for (const std::string &name : ListFiles(kept, "*.*", FileKinds::WithHidden)) {
@@ -142,6 +142,7 @@ static void UnmarkAllRows(LibraryState &state) {
 
 void ResetAll(LibraryState &state, const std::vector<std::string> &names, Caption &caption,
               Failures &failures) {
+  const PlacesScope places(state);
   if (RefusedForLink(state, {}, "nothing was reset", failures))
     return;
   {

@@ -11,10 +11,11 @@
 
 namespace fs = std::filesystem;
 
-bool IsCampaignFolder(const fs::path &folder) {
-  const std::string name = NameText(folder);
+bool IsCampaignName(std::string_view name) {
   return name.starts_with("C ") || name.starts_with("C-");
 }
+
+bool IsCampaignFolder(const fs::path &folder) { return IsCampaignName(NameText(folder)); }
 
 void CarrySaveFiles(const fs::path &eawDir, const fs::path &campaign, Caption &caption,
                     Failures &failures) {

@@ -40,9 +40,10 @@ std::vector<FileStep> UnplaceFiles(LibraryState &state, const Ledger &ledger,
                                    const std::vector<Journal::Entry> &entries, bool afterCrash,
                                    Caption &caption, Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
+  const OriginalsFolders originals = AllOriginalsFolders(keeping);
   const auto providers = ledger.LastProviders();
   const std::unordered_set<std::string> kept = KeptOriginals(keeping);
-  GamePlaces places(state.EAWDir);
+  GamePlaces places(PlaceFoldersOf(state));
   std::vector<FileStep> leftovers;
   ProgressMeter meter(caption, static_cast<int>(entries.size()));
   for (const Journal::Entry &entry : entries) {
@@ -63,7 +64,8 @@ std::vector<FileStep> UnplaceFiles(LibraryState &state, const Ledger &ledger,
                         Child(folder, file.name), failures))
         ++state.tally.restored;
     } else if (originalKept) {
-      if (MoveReplacing(OriginalPath(keeping, file), Child(folder, file.name), failures))
+      if (MoveReplacing(Child(originals[static_cast<size_t>(file.place)], file.name),
+                        Child(folder, file.name), failures))
         ++state.tally.restored;
       else
         leftovers.push_back({file, true});

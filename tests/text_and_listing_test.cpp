@@ -1,9 +1,12 @@
 #include "base/file_ops.h"
 #include "base/listing.h"
+#include "base/names.h"
 #include "base/text_file.h"
 #include "tests/test_folder.h"
 
 #include <gtest/gtest.h>
+
+#include <algorithm>
 
 namespace fs = std::filesystem;
 using Lines = std::vector<std::string>;
@@ -62,6 +65,22 @@ TEST(Listing, PatternsMatchLikeWindowsIgnoringCase) {
   EXPECT_TRUE(MatchesPatternList("skin.GIF", "mypic;skinpic;*.jpg;*.bmp;*.gif"));
   EXPECT_FALSE(MatchesPatternList("skin.png", "mypic;;*.jpg"));
   EXPECT_FALSE(MatchesPatternList("anything", ""));
+}
+
+TEST(Listing, ALargeFolderComesInTheSameOrder) {
+  // Enough names, sharing long beginnings, to be sorted byte by byte rather than compared.
+  TestFolder folder;
+  Lines names;
+  for (int i = 0; i < 150; ++i)
+    for (const char *stem : {"Addon ", "addon_", "ADDON-A", "b"})
+      names.push_back(stem + std::to_string(i * 7 % 150) + ".dat");
+  if (IsCaseSensitive(folder.Path()))
+    names.insert(names.end(), {"addon-a1.dat", "ADDON-A1.DAT", "Addon-A1.dat", "b", "B"});
+  for (const std::string &name : names)
+    folder.Write(name);
+  std::sort(names.begin(), names.end(),
+            [](const std::string &a, const std::string &b) { return NameLess(a, b); });
+  EXPECT_EQ(ListFiles(folder.Path()), names);
 }
 
 TEST(Listing, FilesAndFoldersComeInOneNameOrder) {
