@@ -11,8 +11,6 @@
 #include "library/move_out.h"
 #include "slots/slot_grid.h"
 
-#include <optional>
-
 namespace fs = std::filesystem;
 
 namespace {
@@ -39,10 +37,8 @@ int LastLoaded(const FolderGrid &grid, const std::string &letter) {
 // that were can still be unloaded. Returns the loaded folders whose files it replaced.
 std::vector<std::string> Load(LibraryState &state, int row, Caption &caption, Failures &failures) {
   const size_t before = failures.Lines().size();
-  // Replaying the record copies nothing: no path is made for each of its folders.
   const std::optional<std::vector<std::string>> overwritten =
-      state.Ready ? MoveIn(state, state.Unigrid.PathOf(row), caption, failures)
-                  : std::vector<std::string>{};
+      MoveIn(state, state.Unigrid.PathOf(row), caption, failures);
   // A folder that was not loaded at all is not marked: there is nothing to unload.
   if (!overwritten)
     return {};
@@ -117,10 +113,8 @@ std::vector<std::string> ClickRow(LibraryState &state, int row, Caption &caption
   state.Unigrid.currentRow = row;
   if (!state.Unigrid.IsFolderRow(row))
     return {};
-  // Found once for the click; replaying the record touches no file and needs none.
-  std::optional<PlacesScope> places;
-  if (state.Ready)
-    places.emplace(state);
+  // The game's place folders are found once for the whole click.
+  const PlacesScope places(state);
   const GridRow &clicked = state.Unigrid.Row(row);
   if (!IsLoaded(clicked)) {
     const fs::path folder = state.Unigrid.PathOf(row);
