@@ -1,5 +1,6 @@
 #include "settings/eaw_ini.h"
 #include "settings/ini_editor.h"
+#include "settings/loose_number.h"
 #include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
@@ -69,4 +70,16 @@ TEST(IniEditor, ShowsTheFileAndSavesTheTextWithOneMoreLine) {
   EXPECT_FALSE(IniEditorSave(game.Path(), "Width=2", failures));
   EXPECT_EQ(game.Read("Eaw.ini"), "x\r\ny\r\n");
   EXPECT_EQ(failures.Lines().size(), 1u);
+}
+
+TEST(LooseNumber, ReadsTheNumberAtTheStartAndShowsItPlainly) {
+  // clang-format off
+  const std::pair<const char *, const char *> cases[] = {
+      {"0800", "800"}, {"1024 ; comment", "1024"}, {"abc", "0"}, {"", "0"}, {"-0", "0"},
+      {" 1 2\t3\n4", "1234"}, {"-7x", "-7"}, {"+7", "7"}, {"1.50.3", "1.5"}, {".5", "0.5"},
+      {"12e2x", "1200"}, {"12D-1", "1.2"}, {"12e", "12"}, {"1e20", "100000000000000000000"},
+      {"1e999", "0"}, {"&HFF", "255"}, {"&h1g", "1"}, {"&O17", "15"}, {"&O9", "0"}, {"&X1", "0"}};
+  // clang-format on
+  for (const auto &[text, shown] : cases)
+    EXPECT_EQ(LooseNumberText(text), shown) << text;
 }

@@ -1,6 +1,7 @@
 #include "base/file_ops.h"
 #include "base/listing.h"
 #include "base/names.h"
+#include "base/plain_name.h"
 #include "base/text_file.h"
 #include "tests/test_folder.h"
 
@@ -106,4 +107,16 @@ TEST(Listing, FilesAndFoldersComeInOneNameOrder) {
     names.push_back(path.filename().string());
   EXPECT_EQ(names, (Lines{"C x", "F-z", "s-a", "S-b"}));
   EXPECT_EQ(folders[0], folder.Path() / "lib" / "C x");
+}
+
+TEST(PlainName, TakesOrdinaryNamesOfAnyBytesAndRefusesEveryPathOrDevice) {
+  for (const std::string name : {"game.cfg", "m1.msn", "F-Spitfire", "a..b", ".hidden",
+                                 "\xC4nderung.txt", "COM0", "console.txt", "nul_x.dat"})
+    EXPECT_TRUE(IsPlainName(name)) << name;
+  using namespace std::string_literals;
+  for (const std::string &name :
+       {""s, "a\0b"s, std::string(256, 'x'), "."s, ".."s, "../victim.dat"s, "a/b"s, "a\\b"s, "C:x"s,
+        "/etc/passwd"s, "CON"s, "nul.txt"s, "Com1.ini"s, "lpt9"s, "nul .txt"s, "name."s, "name "s,
+        "tab\there"s, "com\xC2\xB9.ini"s})
+    EXPECT_FALSE(IsPlainName(name)) << name;
 }
