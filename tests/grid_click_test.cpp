@@ -20,9 +20,9 @@ TEST_F(GridClick, GreenRowUnloadsEnterClicksOtherKeysAndRowsOutsideDoNothing) {
   game.WithCategories("Campaigns: C\r\nSounds: N\r\nSkins: S\r\n");
   Gather(selector.ClickRow(0)); // empty grid
   Gather(selector.StartUp());
-  Gather(selector.ClickRow(-1)); // above the first row
+  EXPECT_EQ(Gather(selector.ClickRow(-1)).summary, ""); // above the first row: clears the line
   const int row = RowOf(State().Unigrid, "S-One");
-  Gather(selector.PressKey(row, 'a'));
+  EXPECT_FALSE(Gather(selector.PressKey(row, 'a')).summary); // other keys leave the line
   EXPECT_FALSE(game.Exists("one.dat"));
   Gather(selector.PressKey(row, kEnterKey));
   EXPECT_TRUE(game.Exists("one.dat"));
