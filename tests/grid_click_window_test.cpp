@@ -11,7 +11,8 @@
 TEST(GridClickWindow, AClickLoadsAGreenRowAndAClickOnItUnloadsIt) {
   GameFolder game;
   game.WithGameFolders().WithCategories("Singles: Q\r\n");
-  game.Addon("Q-Mix", {"a.MSN", "d.txt"});
+  game.Addon("Q-Mix", {"a.MSN", "d.txt", "held.dat"});
+  game.MakeFolder("held.dat/in-the-way"); // a copy that fails is told in a box
   WindowDriver driver(game.Path());
   const QString caption = driver.Window().windowTitle();
 
@@ -22,6 +23,9 @@ TEST(GridClickWindow, AClickLoadsAGreenRowAndAClickOnItUnloadsIt) {
   EXPECT_EQ(driver.Mark(1), "S");
   EXPECT_EQ(driver.Window().windowTitle(), caption);
   EXPECT_EQ(driver.Summary(), "Loaded \"Q-Mix\": 2 files copied.");
+  const QStringList boxes = driver.TakeMessages();
+  ASSERT_EQ(boxes.size(), 1);
+  EXPECT_TRUE(boxes[0].contains("held.dat")) << boxes[0].toStdString();
 
   driver.ClickRow(1);
   EXPECT_FALSE(game.Exists("d.txt"));
