@@ -14,16 +14,16 @@ TEST_F(CategoryView, LettersBeyondAsciiListTheirFoldersAndNoLetterListsTheProgra
   game.MakeFolder("ZEP128/\xC4-latin"); // a name in Windows-1252 bytes
 #endif
   game.MakeFolder("ZEP128/#Selector");
-  Gather(selector.StartUp());
+  Gather(selector->StartUp());
   const auto shown = [&](int entry) {
-    selector.ShowCategory(entry);
+    selector->ShowCategory(entry);
     std::vector<std::string> names;
-    for (const GridRow &row : selector.State().Unigrid.rows)
+    for (const GridRow &row : selector->State().Unigrid.rows)
       if (row.shown)
         names.push_back(row.name);
     return names;
   };
-  EXPECT_EQ(selector.State().Codes, (std::vector<std::string>{"\xC3\x84", "#", "\xC3\x96"}));
+  EXPECT_EQ(selector->State().Codes, (std::vector<std::string>{"\xC3\x84", "#", "\xC3\x96"}));
 #ifndef _WIN32
   EXPECT_EQ(shown(2), (std::vector<std::string>{"\xC3\x84-utf8", "\xC4-latin"}));
   EXPECT_EQ(shown(0).size(), 4u);

@@ -38,11 +38,11 @@ TEST_P(FolderLink, IsNamedAndNothingIsWrittenMovedOrChangedThroughIt) {
   // A Reset All cut short, whose recovery puts the kept originals back.
   game.Write("ZEP128/#Selector/journal.txt", "restore\r\n\r\n");
   const std::map<std::string, std::string> before = Snapshot(outside.Path());
-  Gather(selector.StartUp());
-  Gather(selector.ClickRow(0));
-  Gather(selector.ClickRow(0));
-  Gather(selector.ResetAll(selector.ResetAllFiles(failures)));
-  Gather(selector.SwitchMusic("Set2", "Set1"));
+  Gather(selector->StartUp());
+  Gather(selector->ClickRow(0));
+  Gather(selector->ClickRow(0));
+  Gather(selector->ResetAll(selector->ResetAllFiles(failures)));
+  Gather(selector->SwitchMusic("Set2", "Set1"));
   EXPECT_EQ(Snapshot(outside.Path()), before);
   EXPECT_TRUE(IsLink(link));
   EXPECT_TRUE(std::any_of(failures.Lines().begin(), failures.Lines().end(),
@@ -60,14 +60,14 @@ INSTANTIATE_TEST_SUITE_P(WhereThingsAreKept, FolderLink,
 
 TEST_F(FolderLink, ACampaignThatBecameALinkIsUnloadedAndItsSavedGamesStay) {
   game.WithCategories("Campaigns: C\r\n").Addon("C-One", {"m.msn"});
-  Gather(selector.StartUp());
-  Gather(selector.ClickRow(0));
+  Gather(selector->StartUp());
+  Gather(selector->ClickRow(0));
   game.Write("Savedata/game.sve", "progress");
   fs::rename(game.Path() / "ZEP128/C-One", outside.Path() / "C-One");
   if (!MakeFolderLink(outside.Path() / "C-One", game.Path() / "ZEP128/C-One"))
     GTEST_SKIP() << "this system lets the test make no folder link";
   const std::map<std::string, std::string> before = Snapshot(outside.Path());
-  Gather(selector.ClickRow(0));
+  Gather(selector->ClickRow(0));
   EXPECT_EQ(Snapshot(outside.Path()), before);
   EXPECT_EQ(game.Read("Savedata/game.sve"), "progress");
   EXPECT_FALSE(game.Exists("Savedata/m.msn"));

@@ -20,7 +20,7 @@ TEST_P(LetterRule, ASecondFolderOfTheLetterKeepsOrUnloadsTheFirst) {
   game.WithCategories("Letter " + code + ": " + code + "\r\n");
   game.Write("ZEP128/" + code + "-one/one.dat");
   game.Write("ZEP128/" + code + "-two/two.dat");
-  Gather(selector.StartUp());
+  Gather(selector->StartUp());
   Click(code + "-one");
   Click(code + "-two");
   EXPECT_EQ(Mark(code + "-one"), several ? "S" : "");
@@ -40,7 +40,7 @@ TEST_F(GridRules, ACampaignUnloadedCarriesHomeItsSaveFilesOnly) {
   game.WithGameFolders().WithCategories("Campaigns: C\r\n");
   game.Write("ZEP128/C first/first.msn");
   game.Write("ZEP128/C-second/second.msn");
-  Gather(selector.StartUp());
+  Gather(selector->StartUp());
   Click("C first");
   game.Write("Savedata/pilot1.sve", "career");
   game.Write("Savedata/mine.msn", "the player's");
@@ -74,8 +74,8 @@ TEST_F(GridRules, ResetAllHonoursEveryDefaultPattern) {
   Names expected = deleted;
   std::sort(expected.begin(), expected.end(),
             [](const std::string &a, const std::string &b) { return NameLess(a, b); });
-  EXPECT_EQ(selector.ResetAllFiles(failures), expected);
-  Gather(selector.ResetAll(expected));
+  EXPECT_EQ(selector->ResetAllFiles(failures), expected);
+  Gather(selector->ResetAll(expected));
   for (const std::string &name : kept)
     EXPECT_TRUE(game.Exists(name)) << name;
   for (const std::string &name : deleted)

@@ -5,15 +5,13 @@
 
 #include <gtest/gtest.h>
 
-#include <memory>
-
 namespace fs = std::filesystem;
 
 namespace {
 
 // A game whose library has three sound folders (several may be loaded) that share "sky.spt",
 // and the game's own "bases.dat" that two of them replace.
-class Keeping : public ::testing::Test {
+class Keeping : public SelectorTest {
 protected:
   void SetUp() override {
     game.WithGameFolders().WithCategories("Sounds: N\r\nSkins: S\r\n");
@@ -26,20 +24,7 @@ protected:
     game.Write("Savedata/a.msn", "the player's mission");
     Restart();
   }
-  // A new start of the program on the same game folder.
-  void Restart() {
-    selector = std::make_unique<Selector>(game.Path(), caption, starter);
-    Gathered(selector->StartUp(), failures);
-  }
-  Outcome Click(const std::string &folder) { return ClickFolder(*selector, folder, failures); }
-  std::string Mark(const std::string &folder) const { return MarkOf(*selector, folder); }
-
   static inline const std::string kOriginal = std::string("the game's own\0\xff bases", 23);
-  GameFolder game;
-  RecordingCaption caption;
-  NotingStarter starter;
-  std::unique_ptr<Selector> selector;
-  Failures failures;
 };
 
 } // namespace
@@ -82,7 +67,7 @@ TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
   EXPECT_EQ(selector->ResetAllLoadedFiles(failures), 3);
   // Gone while the player was asked: neither a failure nor a deletion.
   fs::remove(game.Path() / "sky.spt");
-  EXPECT_EQ(Gathered(selector->ResetAll(names), failures).summary, "Reset All: 2 files put back.");
+  EXPECT_EQ(Gather(selector->ResetAll(names)).summary, "Reset All: 2 files put back.");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
   EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
   EXPECT_FALSE(game.Exists("sky.spt"));
@@ -216,7 +201,7 @@ TEST_F(Keeping, ResetAllUnloadsEveryFolderInEveryPlaceThenDeletesTheOtherMatches
   game.Write("readme.txt", "another match");
   EXPECT_EQ(selector->ResetAllFiles(failures), std::vector<std::string>{"readme.txt"});
   EXPECT_EQ(selector->ResetAllLoadedFiles(failures), 5);
-  Gathered(selector->ResetAll({"readme.txt"}), failures);
+  Gather(selector->ResetAll({"readme.txt"}));
   for (const char *gone : {"notes.xyz", "Music/tune.bgm", "sky.spt", "readme.txt"})
     EXPECT_FALSE(game.Exists(gone)) << gone;
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);

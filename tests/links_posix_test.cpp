@@ -17,7 +17,7 @@ protected:
     game.Write("Music.ini", "Set1\r\nSet2\r\n");
     game.Write("Set1/a.bgm");
     outside.Write("target.txt", "outside");
-    Gather(selector.StartUp());
+    Gather(selector->StartUp());
   }
   // A link at `relative` in the game folder to the outside file; false when it cannot be made.
   bool Plant(const std::string &relative) {
@@ -44,11 +44,11 @@ TEST_F(Links, TemporaryNamesPlantedAsLinksAreNeverWrittenThrough) {
     game.MakeFolder("ZEP128/#Selector");
     ASSERT_TRUE(Plant(name)) << name;
   }
-  Gather(selector.ClickRow(0));
-  Gather(selector.SaveSettings({"1024"}));
-  EXPECT_TRUE(Gather(selector.SwitchMusic("Set2", "Set1")).done);
+  Gather(selector->ClickRow(0));
+  Gather(selector->SaveSettings({"1024"}));
+  EXPECT_TRUE(Gather(selector->SwitchMusic("Set2", "Set1")).done);
   fs::remove(game.Path() / "ZEP128/zep.ini");
-  Gather(selector.RefreshLibrary());
+  Gather(selector->RefreshLibrary());
   EXPECT_EQ(game.Read("ZEP128/zep.ini"), DefaultCategoryText());
   EXPECT_EQ(game.Read("planes.dat"), "planes.dat");
   EXPECT_EQ(game.Record(), "S-One\r\n\r\n");
@@ -63,9 +63,9 @@ TEST_F(Links, LinkedFilesAreRefusedAndWhatTheyPointAtStaysAsItWas) {
   ASSERT_TRUE(Plant("ZEP128/S-One/linked.dat"));
   fs::remove(game.Path() / "eaw.ini");
   ASSERT_TRUE(Plant("eaw.ini"));
-  Gather(selector.ClickRow(0));
-  Gather(selector.SaveSettings({"1024"}));
-  EXPECT_FALSE(Gather(selector.SaveSettingsFile("Width=1")).done);
+  Gather(selector->ClickRow(0));
+  Gather(selector->SaveSettings({"1024"}));
+  EXPECT_FALSE(Gather(selector->SaveSettingsFile("Width=1")).done);
   EXPECT_FALSE(game.Exists("linked.dat"));
   EXPECT_TRUE(fs::is_symlink(game.Path() / "eaw.ini"));
   ExpectOutsideUntouched();
@@ -77,15 +77,15 @@ TEST_F(Links, LinkedFilesAreRefusedAndWhatTheyPointAtStaysAsItWas) {
 TEST_F(Links, LinkedSetupsAreNeitherReadNorWrittenNorDeleted) {
   fs::create_directories(game.Path() / "ZEP128/#Selector/setups");
   ASSERT_TRUE(Plant("ZEP128/#Selector/setups/linked.txt"));
-  EXPECT_EQ(Gather(selector.SwitchToSetup("linked")).notice, "");
+  EXPECT_EQ(Gather(selector->SwitchToSetup("linked")).notice, "");
   EXPECT_NE(failures.HeadingOr("").find("it is a link"), std::string::npos);
   fs::remove_all(game.Path() / "ZEP128/#Selector/setups");
   fs::create_directory_symlink(outside.Path(), game.Path() / "ZEP128/#Selector/setups");
-  EXPECT_EQ(selector.Setups(), std::vector<std::string>{});
-  EXPECT_FALSE(Gather(selector.SaveSetup("target")).done);
-  EXPECT_FALSE(Gather(selector.ResetAll({})).summary); // no way back, so nothing reset
-  EXPECT_FALSE(Gather(selector.DeleteSetup("target")).done);
-  EXPECT_EQ(Gather(selector.SwitchToSetup("target")).notice, "");
+  EXPECT_EQ(selector->Setups(), std::vector<std::string>{});
+  EXPECT_FALSE(Gather(selector->SaveSetup("target")).done);
+  EXPECT_FALSE(Gather(selector->ResetAll({})).summary); // no way back, so nothing reset
+  EXPECT_FALSE(Gather(selector->DeleteSetup("target")).done);
+  EXPECT_EQ(Gather(selector->SwitchToSetup("target")).notice, "");
   ExpectOutsideUntouched();
 }
 
@@ -93,7 +93,7 @@ TEST_F(Links, APlaceForTheGamesOwnFileTakenByALinkLoopLeavesThatFileAlone) {
   game.Write("planes.dat", "own");
   game.MakeFolder("ZEP128/#Selector/originals/G");
   fs::create_symlink("planes.dat", game.Path() / "ZEP128/#Selector/originals/G/planes.dat");
-  Gather(selector.ClickRow(0));
+  Gather(selector->ClickRow(0));
   EXPECT_EQ(game.Read("planes.dat"), "own");
   EXPECT_NE(failures.Message("").find("planes.dat"), std::string::npos);
 }

@@ -14,13 +14,13 @@ TEST_F(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   game.Write("planes.dat", "planes");
   for (const char *name : {"F-Spit", "S-Camo", "G-Sky", "unused"})
     game.Write(std::string("ZEP128/") + name + "/planes.dat", "addon");
-  const SelectorState &state = selector.State();
+  const SelectorState &state = selector->State();
   // The category list is read at start-up only: a refresh keeps its letters.
   game.WithCategories("Skins: S\r\n");
-  Gather(selector.StartUp());
+  Gather(selector->StartUp());
   fs::remove(game.Path() / "ZEP128/zep.ini");
   fs::remove(game.Path() / "ZEP128/FoldersLoaded.txt");
-  Gather(selector.RefreshLibrary());
+  Gather(selector->RefreshLibrary());
   EXPECT_EQ(game.Read("ZEP128/zep.ini"), DefaultCategoryText());
   EXPECT_TRUE(game.Exists("ZEP128/FoldersLoaded.txt"));
   EXPECT_EQ(RowNames(state.Unigrid, true), (Names{"F-Spit", "S-Camo", "G-Sky"}));
@@ -29,9 +29,9 @@ TEST_F(Refresh, RereadsTheLibraryAndKeepsLoadedRowsWithoutTouchingFiles) {
   fs::remove_all(game.Path() / "ZEP128/F-Spit");
   game.MakeFolder("ZEP128/F-Hurri");
   game.MakeFolder("ZEP128/S-Desert");
-  selector.ShowCategory(2);
-  selector.HoverRow(1);
-  const Outcome refreshed = Gather(selector.RefreshLibrary());
+  selector->ShowCategory(2);
+  selector->HoverRow(1);
+  const Outcome refreshed = Gather(selector->RefreshLibrary());
 
   EXPECT_EQ(RowNames(state.Unigrid, true),
             (Names{"F-Hurri", "S-Camo [S]", "S-Desert", "G-Sky [S]"}));

@@ -9,8 +9,8 @@ using Refusals = SelectorTest;
 TEST_F(Refusals, AFileTooLargeToBeSettingsIsNamedAndLeftAlone) {
   const std::string empties((1 << 20) + 1, '\n');
   game.Write("eaw.ini", empties);
-  EXPECT_FALSE(selector.ReadSettings(failures)[0]);
-  Gather(selector.SaveSettings({"1024"}));
+  EXPECT_FALSE(selector->ReadSettings(failures)[0]);
+  Gather(selector->SaveSettings({"1024"}));
   EXPECT_EQ(game.Read("eaw.ini"), empties);
   ASSERT_FALSE(failures.Empty());
   EXPECT_NE(failures.Lines()[0].find("eaw.ini: was not read: it is 1024 KB"), std::string::npos);
@@ -22,11 +22,11 @@ TEST_F(Refusals, FoldersTheGameNeedsAreNoMusicSets) {
   game.Write("Savedata/a.sve");
   game.Write("Set1/a.bgm");
   game.Write("Music/b.bgm");
-  const MusicList music = selector.MusicSets(failures);
+  const MusicList music = selector->MusicSets(failures);
   EXPECT_EQ(music.entries, std::vector<std::string>{"Set1"});
   EXPECT_EQ(music.current, "Set2");
-  EXPECT_FALSE(Gather(selector.SwitchMusic("Set2", "zep128")).done);
-  EXPECT_FALSE(Gather(selector.SwitchMusic("Savedata", "Set1")).done);
+  EXPECT_FALSE(Gather(selector->SwitchMusic("Set2", "zep128")).done);
+  EXPECT_FALSE(Gather(selector->SwitchMusic("Savedata", "Set1")).done);
   EXPECT_TRUE(game.Exists("ZEP128/zep.ini"));
   EXPECT_TRUE(game.Exists("Savedata/a.sve"));
   EXPECT_TRUE(game.Exists("Music/b.bgm"));
@@ -39,8 +39,8 @@ TEST_F(Refusals, NamesOfTheLongestLengthAreLoaded) {
   const std::string name = std::string(246, 'n') + ".dat";
   game.WithCategories("Skins: S\r\n");
   game.Write("ZEP128/S-Long/" + name, "long");
-  Gather(selector.StartUp());
-  Gather(selector.ClickRow(0));
+  Gather(selector->StartUp());
+  Gather(selector->ClickRow(0));
   EXPECT_EQ(game.Read(name), "long");
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
@@ -79,10 +79,10 @@ TEST(Reasons, AFullDiskAHeldFileAndNamesWindowsCannotKeepAreCalledSo) {
 TEST_F(Refusals, AFolderThatCouldNotBeLoadedAtAllIsNotMarkedLoaded) {
   game.WithCategories("Skins: S\r\n");
   game.Addon("S-a", {"a.dat"});
-  Gather(selector.StartUp());
+  Gather(selector->StartUp());
   game.MakeFolder("ZEP128/#Selector/journal.txt.partial"); // the journal cannot be written
-  Gather(selector.ClickRow(RowOf(selector.State().Unigrid, "S-a")));
-  EXPECT_FALSE(IsLoaded(selector.State().Unigrid.Row(RowOf(selector.State().Unigrid, "S-a"))));
+  Gather(selector->ClickRow(RowOf(selector->State().Unigrid, "S-a")));
+  EXPECT_FALSE(IsLoaded(selector->State().Unigrid.Row(RowOf(selector->State().Unigrid, "S-a"))));
   EXPECT_FALSE(game.Exists("a.dat"));
   EXPECT_EQ(game.Record(), "");
   EXPECT_NE(failures.Message("").find("was not loaded"), std::string::npos);

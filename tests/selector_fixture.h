@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+#include <memory>
+
 // Adds what a verb could not do to `failures`, one collector for a test's run; returns the outcome.
 inline Outcome Gathered(Outcome outcome, Failures &failures) {
   failures.Append(outcome.failures);
@@ -25,13 +27,18 @@ inline std::string MarkOf(const Selector &selector, const std::string &folder) {
 // A Selector on a fresh game folder, for tests that drive the program's verbs.
 class SelectorTest : public ::testing::Test {
 protected:
-  Outcome Click(const std::string &folder) { return ClickFolder(selector, folder, failures); }
-  std::string Mark(const std::string &folder) const { return MarkOf(selector, folder); }
+  Outcome Click(const std::string &folder) { return ClickFolder(*selector, folder, failures); }
+  std::string Mark(const std::string &folder) const { return MarkOf(*selector, folder); }
   Outcome Gather(Outcome outcome) { return Gathered(std::move(outcome), failures); }
+  // A new start of the program on the same game folder.
+  void Restart() {
+    selector = std::make_unique<Selector>(game.Path(), caption, starter);
+    Gather(selector->StartUp());
+  }
 
   GameFolder game;
   RecordingCaption caption;
   NotingStarter starter;
-  Selector selector{game.Path(), caption, starter};
+  std::unique_ptr<Selector> selector = std::make_unique<Selector>(game.Path(), caption, starter);
   Failures failures;
 };

@@ -25,9 +25,9 @@ protected:
     game.Write("ZEP128/N-y/n.wav", "y");
     game.Write("ZEP128/N-x/shared.dat", "x");
     game.Write("orig.dat", "the game's");
-    Gather(selector.StartUp());
+    Gather(selector->StartUp());
   }
-  Names Loaded() { return selector.LoadedFolderNames(failures); }
+  Names Loaded() { return selector->LoadedFolderNames(failures); }
   std::string Setup(const std::string &name) {
     return game.Read("ZEP128/#Selector/setups/" + name + ".txt");
   }
@@ -39,14 +39,14 @@ TEST_F(Setups, SaveKeepsLoadOrderAndSwitchingKeepsTheRulesAndGoesBack) {
   Click("N-y");
   Click("S-a");
   Click("N-x");
-  EXPECT_EQ(Gather(selector.SaveSetup("Mine")).summary, "Saved 3 loaded folders as \"Mine\".");
+  EXPECT_EQ(Gather(selector->SaveSetup("Mine")).summary, "Saved 3 loaded folders as \"Mine\".");
   EXPECT_EQ(Setup("Mine"), "N-y\r\nS-a\r\nN-x\r\n");
   // Written by hand: a byte-order mark, trailing blanks, a blank line, two skins, a campaign, a
   // folder that is gone.
   game.Write("ZEP128/#Selector/setups/hand.TXT",
              "\xEF\xBB\xBFS-a\r\nN-x  \r\n\r\nN-Gone\nS-b\r\nC-one\r\nN-y");
-  EXPECT_EQ(selector.Setups(), (Names{"hand", "Mine"}));
-  const Outcome switched = Gather(selector.SwitchToSetup("hand"));
+  EXPECT_EQ(selector->Setups(), (Names{"hand", "Mine"}));
+  const Outcome switched = Gather(selector->SwitchToSetup("hand"));
   EXPECT_EQ(switched.notice, "Only one folder of letter \"S\" can be loaded: \"S-b\" was "
                              "loaded, not \"S-a\".");
   ASSERT_EQ(failures.Lines(), Names{"\"N-Gone\" is not in the library, so it was not loaded"});
@@ -60,7 +60,7 @@ TEST_F(Setups, SaveKeepsLoadOrderAndSwitchingKeepsTheRulesAndGoesBack) {
             "Switched to \"hand\": 3 folders unloaded, 4 loaded; 8 files copied, 7 deleted, "
             "2 put back.");
 
-  Gather(selector.SwitchToSetup("Mine"));
+  Gather(selector->SwitchToSetup("Mine"));
   EXPECT_EQ(Loaded(), (Names{"N-y", "S-a", "N-x"}));
   EXPECT_EQ(game.Read("n.wav"), "x");
   EXPECT_EQ(game.Read("shared.dat"), "x");
@@ -73,23 +73,23 @@ TEST_F(Setups, ResetAllSavesTheWayBackAndSwitchingUndoesIt) {
   Click("S-a");
   Click("N-x");
   game.Write("ZEP128/#Selector/setups/Before Reset All.txt", "N-y\r\n");
-  Gather(selector.ResetAll(selector.ResetAllFiles(failures)));
+  Gather(selector->ResetAll(selector->ResetAllFiles(failures)));
   EXPECT_EQ(Loaded(), Names{});
   EXPECT_EQ(game.Read("orig.dat"), "the game's");
   EXPECT_EQ(Setup("Before Reset All"), "S-a\r\nN-x\r\n");
-  Gather(selector.SwitchToSetup("Before Reset All"));
+  Gather(selector->SwitchToSetup("Before Reset All"));
   EXPECT_EQ(Loaded(), (Names{"S-a", "N-x"}));
   EXPECT_EQ(game.Read("orig.dat"), "orig.dat");
   EXPECT_EQ(game.Read("shared.dat"), "x");
-  EXPECT_EQ(Gather(selector.SwitchToSetup("Before Reset All")).summary,
+  EXPECT_EQ(Gather(selector->SwitchToSetup("Before Reset All")).summary,
             "Switched to \"Before Reset All\": 0 folders unloaded, 0 loaded; no file changed.");
   EXPECT_TRUE(failures.Empty()) << failures.Message("");
-  EXPECT_TRUE(Gather(selector.DeleteSetup("before reset all")).done);
-  EXPECT_EQ(selector.Setups(), Names{});
-  EXPECT_FALSE(Gather(selector.DeleteSetup("Before Reset All")).done);
+  EXPECT_TRUE(Gather(selector->DeleteSetup("before reset all")).done);
+  EXPECT_EQ(selector->Setups(), Names{});
+  EXPECT_FALSE(Gather(selector->DeleteSetup("Before Reset All")).done);
   // A setup whose writing a crash cut short leaves its temporary file; the next start removes it.
   game.Write("ZEP128/#Selector/setups/Before Reset All.txt.partial", "S-a\r\n");
-  Gather(Selector(game.Path(), caption, starter).StartUp());
+  Restart();
   EXPECT_FALSE(game.Exists("ZEP128/#Selector/setups/Before Reset All.txt.partial"));
 }
 
@@ -106,20 +106,20 @@ TEST_F(Setups, HostileSetupsAndNamesAreRefusedWhole) {
         std::string("N-x\r\nC:S-b"), std::string("N-x\r\nnul.txt"), many,
         "N-x\r\n" + std::string(1 << 20, ' ')}) {
     game.Write("ZEP128/#Selector/setups/bad.txt", bytes);
-    const Outcome refused = selector.SwitchToSetup("bad");
+    const Outcome refused = selector->SwitchToSetup("bad");
     EXPECT_EQ(refused.notice, "");
     EXPECT_TRUE(Has(refused.failures.HeadingOr(""), "The setup \"bad\" was not used"))
         << bytes.substr(0, 20);
     EXPECT_EQ(Loaded(), Names{"S-a"});
   }
   for (const char *name : {"", "..", "a/b", "a\\b", "CON", "lpt1.x", "x?", "a*", "<b>", "dot."})
-    EXPECT_FALSE(Gather(selector.SaveSetup(name)).done) << name;
-  EXPECT_EQ(selector.Setups(), Names{"bad"});
+    EXPECT_FALSE(Gather(selector->SaveSetup(name)).done) << name;
+  EXPECT_EQ(selector->Setups(), Names{"bad"});
 }
 
 TEST_F(Setups, FilesOfAFolderSayWhereEachStandsAndWhoElseHasIt) {
   const auto files = [&](const std::string &folder) {
-    return selector.FolderFiles(RowOf(selector.State().Unigrid, folder), failures);
+    return selector->FolderFiles(RowOf(selector->State().Unigrid, folder), failures);
   };
   const auto states = [&](const std::string &folder) {
     Names lines;

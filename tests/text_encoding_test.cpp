@@ -68,13 +68,13 @@ TEST_F(Windows1252Files, NameTheFoldersAndFilesTheyMean) {
   game.MakeFolder("Kl\xC3\xA4nge");
   game.Write("ZEP128/CleanUp.ini", "*.d\xE4t\r\n");
   game.Write("alt.d\xC3\xA4t");
-  Gather(selector.StartUp());
-  const SelectorState &state = selector.State();
+  Gather(selector->StartUp());
+  const SelectorState &state = selector->State();
   EXPECT_EQ(state.List3.back(), "Skins f\xC3\xBCr alle");
   EXPECT_EQ(RowNames(state.Unigrid, true), Names{"S-J\xC3\xA4ger [S]"});
-  EXPECT_EQ(selector.HoverRow(0)->description,
+  EXPECT_EQ(selector->HoverRow(0)->description,
             "\xE2\x80\x9CGr\xC3\xBCn\xE2\x80\x9D \xE2\x82\xAC\r\n");
-  EXPECT_EQ(selector.MusicSets(failures).entries, Names{"Kl\xC3\xA4nge"});
+  EXPECT_EQ(selector->MusicSets(failures).entries, Names{"Kl\xC3\xA4nge"});
   EXPECT_EQ(CleanUpNames(state, failures), Names{"alt.d\xC3\xA4t"});
   // Only the notice that the record from before the ledger gave the ledger.
   EXPECT_EQ(failures.Lines().size(), 1u) << failures.Message("");
