@@ -17,9 +17,10 @@ public:
     firstBytesByLength_[name.size()].set(FirstByte(name));
   }
   // Whether `name` may be one of the names added.
-  bool MayHold(std::string_view name) const {
-    return name.size() < firstBytesByLength_.size() &&
-           firstBytesByLength_[name.size()].test(FirstByte(name));
+  bool MayHold(std::string_view name) const { return MayHold(name.size(), FirstByte(name)); }
+  // Whether a name of `length` bytes that starts with `first` may be one of them.
+  bool MayHold(size_t length, size_t first) const {
+    return length < firstBytesByLength_.size() && firstBytesByLength_[length].test(first);
   }
 
 private:

@@ -68,11 +68,10 @@ std::string Quoted(const std::vector<std::string> &names) {
 // Whether the record names the ledger's folders, no more and no fewer, each line as it is or, when
 // the ledger has no such name, read as Windows-1252. Checked with the ledger's names hashed once
 // and no copy of them: thousands are loaded in a large library.
-bool RecordAgrees(const std::vector<std::string> &loaded,
-                  const std::vector<std::string> &recorded) {
+bool RecordAgrees(const Ledger &ledger, const std::vector<std::string> &recorded) {
   std::unordered_map<std::string_view, bool> named;
-  for (const std::string &name : loaded)
-    named.emplace(name, false);
+  for (const LoadedFolder &folder : ledger.Folders())
+    named.emplace(folder.name, false);
   size_t found = 0;
   for (const std::string &line : recorded) {
     auto entry = named.find(line);
@@ -89,11 +88,11 @@ bool RecordAgrees(const std::vector<std::string> &loaded,
 // changed; `recorded` follows what the record holds.
 void FollowLedger(const LibraryState &state, const Ledger &ledger,
                   std::vector<std::string> &recorded, Failures &failures) {
+  if (RecordAgrees(ledger, recorded))
+    return;
   std::vector<std::string> loaded;
   for (const LoadedFolder &folder : ledger.Folders())
     loaded.push_back(folder.name);
-  if (RecordAgrees(loaded, recorded))
-    return;
   const std::unordered_set<std::string> hashedLedger(loaded.begin(), loaded.end());
   std::unordered_set<std::string> hashedRecord;
   for (const std::string &line : recorded)

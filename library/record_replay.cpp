@@ -18,15 +18,15 @@ void ReplayRecord(LibraryState &state, const std::vector<std::string> &lines, Fa
   // Index the recorded names, not the rows, and find their rows in one pass: a library of tens
   // of thousands of folders then costs no copy of its names, and hashes only those that the
   // sieve lets through. Each line is looked up as written and read as UTF-8.
-  std::vector<std::string> utf8Lines;
-  utf8Lines.reserve(lines.size());
+  std::vector<std::string> converted; // the lines that are not UTF-8, read as Windows-1252
+  converted.reserve(lines.size());
+  std::vector<std::string_view> utf8Lines;
   std::unordered_map<std::string_view, size_t> keyOf;
   keyOf.reserve(2 * lines.size());
   NameSieve sieve;
   for (const std::string &line : lines) {
-    utf8Lines.push_back(TextAsUtf8(line));
-    for (const std::string_view name :
-         {std::string_view(line), std::string_view(utf8Lines.back())}) {
+    utf8Lines.push_back(IsUtf8(line) ? line : converted.emplace_back(TextAsUtf8(line)));
+    for (const std::string_view name : {std::string_view(line), utf8Lines.back()}) {
       keyOf.try_emplace(name, keyOf.size());
       sieve.Add(name);
     }
