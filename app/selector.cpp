@@ -36,8 +36,7 @@ Outcome Selector::StartUp() {
   const std::vector<SkippedLine> skipped = PrepareLibrary(state_, failures);
   BuildGrid(state_, state_.Codes);
   EnsureRecord(state_, failures);
-  MendRecordFromLedger(state_, caption_, failures);
-  ReplayRecord(state_, failures);
+  ReplayRecord(state_, MendRecordFromLedger(state_, caption_, failures), failures);
   state_.BackPic = GamePicture(state_.EAWDir, "background");
   state_.NewPic = GamePicture(state_.EAWDir, "newpic");
   ShowCategory(0);

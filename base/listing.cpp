@@ -4,7 +4,10 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdint>
+#include <cstring>
 #include <system_error>
+#include <utility>
 
 #ifdef _WIN32
 #include <windows.h>
@@ -103,8 +106,7 @@ enum class Kind { File, HiddenFile, Folder, Other };
 #ifdef _WIN32
 // Calls `visit` with each entry's name and kind, from one search; hidden and system files are
 // told apart, as they are no files to the game.
-std::error_code ForEachEntry(const fs::path &folder,
-                             const std::function<void(std::string &&name, Kind kind)> &visit) {
+template <typename Visit> std::error_code ForEachEntry(const fs::path &folder, const Visit &visit) {
   WIN32_FIND_DATAW found;
   // The basic form leaves out the short names, and large fetches take fewer trips to the disk.
   const HANDLE search = FindFirstFileExW((folder / L"*").c_str(), FindExInfoBasic, &found,
@@ -146,15 +148,15 @@ Kind KindOf(int folder, const dirent &entry) {
   return S_ISREG(info.st_mode) ? Kind::File : S_ISDIR(info.st_mode) ? Kind::Folder : Kind::Other;
 }
 
-std::error_code ForEachEntry(const fs::path &folder,
-                             const std::function<void(std::string &&name, Kind kind)> &visit) {
+// Calls `visit` with each entry's name, valid during the call, and kind.
+template <typename Visit> std::error_code ForEachEntry(const fs::path &folder, const Visit &visit) {
   DIR *listing = ::opendir(folder.c_str());
   if (!listing)
     return std::error_code(errno, std::generic_category());
   while (const dirent *entry = ::readdir(listing)) {
     const std::string_view name = entry->d_name;
     if (name != "." && name != "..")
-      visit(std::string(name), KindOf(::dirfd(listing), *entry));
+      visit(name, KindOf(::dirfd(listing), *entry));
   }
   ::closedir(listing);
   return {};
@@ -170,17 +172,47 @@ struct SortEntry {
 // How many entries a bucket must hold to be split by its next byte rather than compared.
 constexpr size_t kRadixMinimum = 64;
 
+// The order of names: by key, then by the name's bytes.
+struct EntryLess {
+  const std::vector<std::string> &names;
+  bool operator()(const SortEntry &a, const SortEntry &b) const {
+    const int keyOrder = a.key.compare(b.key);
+    return keyOrder != 0 ? keyOrder < 0 : names[a.index] < names[b.index];
+  }
+};
+
+// The eight key bytes from `depth` on as one number that orders as they do; a key that ends
+// sooner has zeros there, which come first, as no name holds a zero byte.
+uint64_t KeyWord(std::string_view key, size_t depth) {
+  unsigned char bytes[8] = {};
+  std::memcpy(bytes, key.data() + depth, std::min<size_t>(sizeof bytes, key.size() - depth));
+  uint64_t word = 0;
+  for (const unsigned char byte : bytes)
+    word = word << 8 | byte;
+  return word;
+}
+
+// Sorts a few entries, whose keys agree on their first `depth` bytes, comparing the next eight
+// bytes as one number and whole keys and names only on a tie.
+void SortFew(SortEntry *entries, size_t count, size_t depth, const EntryLess &less) {
+  std::array<std::pair<uint64_t, SortEntry>, kRadixMinimum> words;
+  for (size_t i = 0; i < count; ++i)
+    words[i] = {KeyWord(entries[i].key, depth), entries[i]};
+  std::sort(words.begin(), words.begin() + static_cast<std::ptrdiff_t>(count),
+            [&](const auto &a, const auto &b) {
+              return a.first != b.first ? a.first < b.first : less(a.second, b.second);
+            });
+  for (size_t i = 0; i < count; ++i)
+    entries[i] = words[i].second;
+}
+
 // Sorts `entries`, whose keys agree on their first `depth` bytes, by key and then by name: one
 // pass per byte splits them into buckets, so that a large folder's names, which share long
 // beginnings, are not compared from their first byte again and again.
 void SortByKey(SortEntry *entries, size_t count, size_t depth, std::vector<SortEntry> &spare,
-               const std::vector<std::string> &names) {
-  const auto less = [&](const SortEntry &a, const SortEntry &b) {
-    const int keyOrder = a.key.compare(b.key);
-    return keyOrder != 0 ? keyOrder < 0 : names[a.index] < names[b.index];
-  };
+               const EntryLess &less) {
   if (count < kRadixMinimum) {
-    std::sort(entries, entries + count, less);
+    SortFew(entries, count, depth, less);
     return;
   }
   // The bytes that all keys share need no pass of their own.
@@ -211,7 +243,7 @@ void SortByKey(SortEntry *entries, size_t count, size_t depth, std::vector<SortE
   std::sort(entries, entries + starts[1], less);
   for (size_t b = 1; b + 1 < starts.size(); ++b)
     if (starts[b + 1] - starts[b] > 1)
-      SortByKey(entries + starts[b], starts[b + 1] - starts[b], depth + 1, spare, names);
+      SortByKey(entries + starts[b], starts[b + 1] - starts[b], depth + 1, spare, less);
 }
 
 // Sorts as NameLess does, with each name's upper-case form made once, in one buffer.
@@ -222,7 +254,10 @@ void SortNames(std::vector<std::string> &names) {
     bytes += name.size();
   keys.reserve(bytes);
   for (const std::string &name : names)
-    keys += Upper(name);
+    keys += name;
+  // As Upper does, in place: one buffer for all the keys.
+  for (char &c : keys)
+    c = static_cast<char>(c - (static_cast<unsigned char>(c - 'a') < 26 ? 'a' - 'A' : 0));
   std::vector<SortEntry> order;
   order.reserve(names.size());
   size_t start = 0;
@@ -231,7 +266,7 @@ void SortNames(std::vector<std::string> &names) {
     start += names[i].size();
   }
   std::vector<SortEntry> spare;
-  SortByKey(order.data(), order.size(), 0, spare, names);
+  SortByKey(order.data(), order.size(), 0, spare, EntryLess{names});
   std::vector<std::string> sorted;
   sorted.reserve(names.size());
   for (const SortEntry &entry : order)
@@ -243,9 +278,9 @@ void SortNames(std::vector<std::string> &names) {
 
 std::error_code ForEachFile(const fs::path &folder,
                             const std::function<void(std::string &&name)> &visit, FileKinds kinds) {
-  return ForEachEntry(folder, [&](std::string &&name, Kind kind) {
+  return ForEachEntry(folder, [&](std::string_view name, Kind kind) {
     if (kind == Kind::File || (kind == Kind::HiddenFile && kinds == FileKinds::WithHidden))
-      visit(std::move(name));
+      visit(std::string(name));
   });
 }
 
@@ -270,9 +305,9 @@ std::vector<std::string> ListFiles(const fs::path &folder, std::string_view patt
 
 std::vector<std::string> ListFolderNames(const fs::path &folder) {
   std::vector<std::string> names;
-  ForEachEntry(folder, [&](std::string &&name, Kind kind) {
+  ForEachEntry(folder, [&](std::string_view name, Kind kind) {
     if (kind == Kind::Folder)
-      names.push_back(std::move(name));
+      names.emplace_back(name);
   });
   SortNames(names);
   return names;

@@ -1,16 +1,28 @@
 #include "base/name_index.h"
 
 #include "base/listing.h"
+#include "base/name_sieve.h"
 #include "base/names.h"
 
 #include <algorithm>
 
+// The upper case of an ASCII letter, as Upper makes it.
+static size_t ToUpperByte(char c) {
+  return static_cast<unsigned char>(c >= 'a' && c <= 'z' ? c - ('a' - 'A') : c);
+}
+
 NameIndex::NameIndex(const std::filesystem::path &folder, const std::vector<std::string> &wanted) {
+  NameSieve sieve;
   for (const std::string &name : wanted)
-    byFolded_.try_emplace(FoldName(name));
+    sieve.Add(byFolded_.try_emplace(FoldName(name)).first->first);
   ForEachFile(
       folder,
-      [this](std::string &&name) {
+      [&](std::string &&name) {
+        // An ASCII name folds to its upper case, of its own length: of a large folder, only
+        // those that could equal a wanted name in length and first letter are folded.
+        if (!name.empty() && !sieve.MayHold(name.size(), ToUpperByte(name.front())) &&
+            IsAscii(name))
+          return;
         const auto found = byFolded_.find(FoldName(name));
         if (found != byFolded_.end())
           found->second.push_back(std::move(name));

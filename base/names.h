@@ -15,6 +15,8 @@ std::string DisplayPath(const std::filesystem::path &path);
 // ASCII upper case, for comparing names with the program's own ASCII names and extensions;
 // other bytes stay as they are.
 std::string Upper(std::string_view text);
+// Whether every byte of `text` is ASCII: such a name folds to its upper case (see FoldName).
+bool IsAscii(std::string_view text);
 // The name with its letter case folded the way the file system ignores it, so that two names of
 // one file give the same text: on Windows the system's ordinal upper case, elsewhere Unicode
 // simple case folding of UTF-8 (ASCII letters in upper case). Bytes that are not UTF-8 stay.

@@ -6,26 +6,24 @@
 #include <cerrno>
 #include <cstring>
 #include <fstream>
-#include <iterator>
 
 namespace fs = std::filesystem;
 
 std::vector<std::string> SplitLines(const std::string &bytes) {
   std::vector<std::string> lines;
-  std::string line;
-  for (size_t i = 0; i < bytes.size(); ++i) {
-    const char c = bytes[i];
-    if (c == '\r' || c == '\n') {
-      if (c == '\r' && i + 1 < bytes.size() && bytes[i + 1] == '\n')
-        ++i;
-      lines.push_back(std::move(line));
-      line.clear();
-    } else {
-      line += c;
-    }
+  // Each line is taken whole rather than byte by byte: a record of thousands of lines is read at
+  // every start-up.
+  const char *const end = bytes.data() + bytes.size();
+  const char *start = bytes.data();
+  while (start != end) {
+    const char *stop = start;
+    while (stop != end && *stop != '\r' && *stop != '\n')
+      ++stop;
+    lines.emplace_back(start, stop);
+    if (stop == end)
+      break;
+    start = stop + (*stop == '\r' && stop + 1 != end && stop[1] == '\n' ? 2 : 1);
   }
-  if (!line.empty())
-    lines.push_back(std::move(line));
   return lines;
 }
 
@@ -47,7 +45,17 @@ std::optional<std::string> ReadBytes(const fs::path &path, Failures &failures,
     failures.Add(path, "cannot be read (" + LastErrorText() + ")");
     return std::nullopt;
   }
-  std::string bytes((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+  // Read in blocks, not character by character; the size is only a hint, as the file may change.
+  std::string bytes;
+  constexpr size_t kBlock = 64 * 1024;
+  size_t got = 0, wanted = error ? kBlock : static_cast<size_t>(size) + 1;
+  do {
+    bytes.resize(got + wanted);
+    in.read(bytes.data() + got, static_cast<std::streamsize>(wanted));
+    got += static_cast<size_t>(in.gcount());
+    wanted = kBlock;
+  } while (in);
+  bytes.resize(got);
   if (in.bad()) {
     failures.Add(path, "cannot be read (" + LastErrorText() + ")");
     return std::nullopt;

@@ -26,10 +26,21 @@ void BuildFolderRows(FolderGrid &grid, const std::vector<std::string> &codes,
   // Group the folders by first character once, so each category line costs only its own rows.
   // Letters are characters, compared as the category file's letters are read. The groups hold
   // positions and the rows are made once, in place: a large library's names are not held twice.
+  // The names come sorted, so a run of one ASCII first byte needs its group looked up once.
   std::unordered_map<std::string, std::vector<size_t>> byLetter;
-  for (size_t i = 0; i < folderNames.size(); ++i)
-    if (!folderNames[i].empty() && !IsReservedFolder(folderNames[i]))
-      byLetter[FirstCharacterOf(folderNames[i]).text].push_back(i);
+  std::vector<size_t> *group = nullptr;
+  int groupByte = -1;
+  for (size_t i = 0; i < folderNames.size(); ++i) {
+    const std::string &name = folderNames[i];
+    if (name.empty() || IsReservedFolder(name))
+      continue;
+    const int first = static_cast<unsigned char>(name.front());
+    if (first != groupByte || first >= 0x80) {
+      group = &byLetter[FirstCharacterOf(name).text];
+      groupByte = first;
+    }
+    group->push_back(i);
+  }
   // A letter on two category lines shows its folders twice: only the last line takes the names.
   std::unordered_map<std::string, size_t> lastLine;
   size_t rowCount = grid.rows.size();
@@ -46,9 +57,10 @@ void BuildFolderRows(FolderGrid &grid, const std::vector<std::string> &codes,
       continue;
     const bool last = line == lastLine[letter];
     for (const size_t i : grouped->second) {
-      GridRow row;
-      row.name = last ? std::move(folderNames[i]) : folderNames[i];
-      grid.rows.push_back(std::move(row));
+      if (last)
+        grid.rows.emplace_back(std::move(folderNames[i]));
+      else
+        grid.rows.emplace_back(folderNames[i]);
     }
   }
 }

@@ -31,7 +31,8 @@ std::optional<Place> PlaceFromLetter(char letter) {
 
 // A name that a line can hold: one without line ends or a leading tab.
 bool Storable(std::string_view name) {
-  return !name.empty() && name.front() != '\t' && name.find_first_of("\r\n") == name.npos;
+  return !name.empty() && name.front() != '\t' &&
+         std::none_of(name.begin(), name.end(), [](char c) { return c == '\r' || c == '\n'; });
 }
 
 // Appends a file line to `text`: a tab, the place letter, the keep mark, the name and the line

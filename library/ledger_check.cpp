@@ -15,7 +15,10 @@
 
 #include <algorithm>
 #include <set>
+#include <string_view>
+#include <unordered_map>
 #include <unordered_set>
+#include <utility>
 
 namespace fs = std::filesystem;
 
@@ -62,20 +65,38 @@ std::string Quoted(const std::vector<std::string> &names) {
   return text;
 }
 
+// Whether the record names the ledger's folders, no more and no fewer, each line as it is or, when
+// the ledger has no such name, read as Windows-1252. Checked with the ledger's names hashed once
+// and no copy of them: thousands are loaded in a large library.
+bool RecordAgrees(const Ledger &ledger, const std::vector<std::string> &recorded) {
+  std::unordered_map<std::string_view, bool> named;
+  for (const LoadedFolder &folder : ledger.Folders())
+    named.emplace(folder.name, false);
+  size_t found = 0;
+  for (const std::string &line : recorded) {
+    auto entry = named.find(line);
+    if (entry == named.end())
+      entry = named.find(TextAsUtf8(line));
+    if (entry == named.end())
+      return false;
+    found += !std::exchange(entry->second, true);
+  }
+  return found == named.size();
+}
+
 // Rewrites the record from the ledger where the two name different folders, and says what
-// changed.
+// changed; `recorded` follows what the record holds.
 void FollowLedger(const LibraryState &state, const Ledger &ledger,
-                  const std::vector<std::string> &recorded, Failures &failures) {
+                  std::vector<std::string> &recorded, Failures &failures) {
+  if (RecordAgrees(ledger, recorded))
+    return;
   std::vector<std::string> loaded;
   for (const LoadedFolder &folder : ledger.Folders())
     loaded.push_back(folder.name);
-  // Hashed, for thousands of loaded folders; ordered only for the message when they differ.
   const std::unordered_set<std::string> hashedLedger(loaded.begin(), loaded.end());
   std::unordered_set<std::string> hashedRecord;
   for (const std::string &line : recorded)
     hashedRecord.insert(hashedLedger.count(line) ? line : TextAsUtf8(line));
-  if (hashedRecord == hashedLedger)
-    return;
   const std::set<std::string> inLedger(loaded.begin(), loaded.end());
   const std::set<std::string> inRecord(hashedRecord.begin(), hashedRecord.end());
   std::vector<std::string> added, dropped;
@@ -85,6 +106,8 @@ void FollowLedger(const LibraryState &state, const Ledger &ledger,
                       std::back_inserter(dropped));
   if (!WriteAtomically(RecordPath(state), JoinCrLf(loaded) + "\r\n", failures))
     return;
+  loaded.erase(std::remove(loaded.begin(), loaded.end(), std::string()), loaded.end());
+  recorded = std::move(loaded);
   std::string text = "The record of loaded folders did not agree with the files in the game, "
                      "and was mended:";
   if (!added.empty())
@@ -96,18 +119,19 @@ void FollowLedger(const LibraryState &state, const Ledger &ledger,
 
 } // namespace
 
-void MendRecordFromLedger(LibraryState &state, Caption &caption, Failures &failures) {
+std::vector<std::string> MendRecordFromLedger(LibraryState &state, Caption &caption,
+                                              Failures &failures) {
   const fs::path keeping = KeepingFolder(state.LibDir);
-  const std::vector<std::string> recorded = ReadLoadedNames(state, failures);
+  std::vector<std::string> recorded = ReadLoadedNames(state, failures);
   if (!FolderCheck(keeping)) {
     if (recorded.empty())
-      return;
+      return recorded;
     const Ledger ledger = LedgerFromRecord(state, recorded);
     if (ledger.Write(keeping, failures))
       failures.Add("The folders recorded as loaded were loaded by an earlier version of the "
                    "program; each of their files found in the game is now taken for their copy.");
     FollowLedger(state, ledger, recorded, failures);
-    return;
+    return recorded;
   }
   Ledger ledger = Ledger::Read(keeping, failures);
   // A Reset All cut short while it carried a campaign's saved games home has no journal yet.
@@ -117,4 +141,5 @@ void MendRecordFromLedger(LibraryState &state, Caption &caption, Failures &failu
   if (RetryLeftovers(state, ledger, caption, failures))
     ledger.Write(keeping, failures);
   FollowLedger(state, ledger, recorded, failures);
+  return recorded;
 }

@@ -189,6 +189,9 @@ TEST_F(Keeping, AnOldRecordGivesTheLedgerOnceAndTheLedgerWinsAtEveryStart) {
   EXPECT_EQ(Mark("N-A") + "|" + Mark("N-B"), "S|");
   EXPECT_NE(failures.Lines().back().find("\"N-A\" is loaded. \"N-B\" is not loaded."),
             std::string::npos);
+  game.WithRecord("\r\n");
+  Restart();
+  EXPECT_EQ(Mark("N-A"), "S");
   Click("N-A");
   EXPECT_FALSE(game.Exists("sky.spt"));
 }

@@ -1,5 +1,6 @@
 #include "base/file_ops.h"
 #include "base/listing.h"
+#include "base/name_index.h"
 #include "base/names.h"
 #include "base/plain_name.h"
 #include "base/text_encoding.h"
@@ -153,6 +154,24 @@ TEST(NameCase, LettersBeyondAsciiMatchInAnyCase) {
   EXPECT_TRUE(MatchesPattern("ä.txt", "?.TXT"));
   EXPECT_FALSE(MatchesPattern("ä.txt", "??.txt"));
   EXPECT_FALSE(MatchesPattern("ö.txt", "ä.txt"));
+}
+
+TEST(NameCase, AFolderIndexFindsEachFileThatFoldsLikeAWantedName) {
+  // The Kelvin sign and the long s fold to ASCII letters of fewer bytes where Unicode folding
+  // applies, so their names are no guide to their folded length or first letter.
+  TestFolder folder;
+  for (const char *name :
+       {"\xE2\x84\xAA.dat", "\xC5\xBF.dat", "k.DAT", "s.dat", "\xC3\x84rmel.dat", "armel.dat"})
+    folder.Write(name);
+  const Lines wanted = {"K.dat", "S.DAT", "\xC3\xA4RMEL.DAT", "ARMEL.DAT", "x.dat"};
+  const NameIndex index(folder.Path(), wanted);
+  for (const std::string &name : wanted) {
+    Lines folded;
+    for (const std::string &listed : ListFiles(folder.Path()))
+      if (FoldName(listed) == FoldName(name))
+        folded.push_back(listed);
+    EXPECT_EQ(index.Matches(name), folded) << name;
+  }
 }
 
 TEST(NameCase, UnloadFindsACopyWhoseNameDiffersBeyondAscii) {
