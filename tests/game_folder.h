@@ -38,7 +38,6 @@ public:
   }
   void Progress(const ProgressFigures &figures) override {
     progress.emplace_back(figures.done, figures.total);
-    bytes.emplace_back(figures.bytesDone, figures.bytesTotal);
   }
   std::chrono::milliseconds ProgressInterval() const override { return {}; }
   // Whether `line` was shown, alone or followed by how far the operation was ("(2 of 5)").
@@ -46,7 +45,6 @@ public:
   std::string text = "Selector";
   std::vector<std::string> shown;
   std::vector<std::pair<int, int>> progress;
-  std::vector<std::pair<std::uint64_t, std::uint64_t>> bytes;
 };
 
 // A starter that only notes what it was asked to start.

@@ -26,8 +26,6 @@ void WindowDriver::ClickRow(int row, int column) {
   QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, grid->visualRect(index).center());
 }
 
-void WindowDriver::PressGridKey(int key) { QTest::keyClick(Grid(), static_cast<Qt::Key>(key)); }
-
 QString WindowDriver::Mark(int row) { return Grid()->model()->index(row - 1, 2).data().toString(); }
 
 QString WindowDriver::Summary() { return Find<QLabel>("Label22")->text(); }

@@ -28,8 +28,6 @@ public:
   QTableView *Grid() { return Find<QTableView>("Unigrid"); }
   // Clicks the name cell of folder row `row` (1 is the first folder).
   void ClickRow(int row, int column = 1);
-  // Types a key into the folder grid.
-  void PressGridKey(int key);
   // The mark column of folder row `row` (1 is the first folder): "S" when loaded.
   QString Mark(int row);
   // The line that sums up the last action.
