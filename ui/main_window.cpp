@@ -130,9 +130,9 @@ void MainWindow::FormLoad() {
   ShowPicture(c_.MyImage, State().BackPic);
   ShowPicture(c_.Image3, State().NewPic);
   c_.SSTab1->setCurrentIndex(0);
+  // Choosing the first entry shows its category and draws the grid (List3_Click).
   c_.List3->setCurrentRow(0);
   c_.SSTab1->setEnabled(true);
-  ShowGridChanges();
   FillMusicList();
   // Finishing an interrupted operation showed its progress in the instructions' place.
   runner_.ShowSummary();
