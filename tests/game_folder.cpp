@@ -34,6 +34,13 @@ bool RecordingCaption::Showed(const std::string &line) const {
          }) != shown.end();
 }
 
+::testing::AssertionResult OneFailure(const Failures &failures, const std::string &part) {
+  if (failures.Lines().size() == 1)
+    return Contains(failures.Lines()[0], part);
+  return ::testing::AssertionFailure() << failures.Lines().size() << " failures, not one:\n"
+                                       << failures.Message("");
+}
+
 std::vector<std::string> RowNames(const FolderGrid &grid, bool marks) {
   std::vector<std::string> names;
   for (int row = 0; row < grid.RowCount(); ++row)

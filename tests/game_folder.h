@@ -59,6 +59,9 @@ public:
   std::vector<bool> windows;
 };
 
+// Passes when `failures` holds exactly one line and it contains `part`.
+::testing::AssertionResult OneFailure(const Failures &failures, const std::string &part);
+
 // The names of the grid's folder rows, in row order; with `marks`, a loaded row's name is
 // followed by " [S]".
 std::vector<std::string> RowNames(const FolderGrid &grid, bool marks = false);

@@ -49,9 +49,26 @@ bool TestFolder::Exists(const std::string &relative) const {
   return fs::exists(Child(path_, relative));
 }
 
+::testing::AssertionResult TestFolder::All(std::initializer_list<std::string> relatives,
+                                           bool exist) const {
+  std::string wrong;
+  for (const std::string &relative : relatives)
+    if (Exists(relative) != exist)
+      wrong += " \"" + relative + "\"";
+  if (wrong.empty())
+    return ::testing::AssertionSuccess();
+  return ::testing::AssertionFailure() << (exist ? "missing:" : "still there:") << wrong;
+}
+
 std::string TestFolder::Read(const std::string &relative) const {
   std::ifstream in(Child(path_, relative), std::ios::binary);
   return std::string((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+}
+
+::testing::AssertionResult Contains(const std::string &text, const std::string &part) {
+  if (text.find(part) != std::string::npos)
+    return ::testing::AssertionSuccess();
+  return ::testing::AssertionFailure() << "\"" << part << "\" is not in:\n" << text;
 }
 
 bool IsWritable(const fs::path &path) {

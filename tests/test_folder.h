@@ -1,6 +1,9 @@
 #pragma once
 
+#include <gtest/gtest.h>
+
 #include <filesystem>
+#include <initializer_list>
 #include <map>
 #include <string>
 
@@ -18,12 +21,21 @@ public:
   // Creates the folder `relative` and those on the way.
   std::filesystem::path MakeFolder(const std::string &relative) const;
   bool Exists(const std::string &relative) const;
+  // Passes when every one of `relatives` exists (or, with `exist` false, none does); a failure
+  // names those that do not match.
+  ::testing::AssertionResult All(std::initializer_list<std::string> relatives,
+                                 bool exist = true) const;
+  ::testing::AssertionResult None(std::initializer_list<std::string> relatives) const {
+    return All(relatives, false);
+  }
   std::string Read(const std::string &relative) const;
 
 private:
   std::filesystem::path path_;
 };
 
+// Passes when `text` contains `part`; a failure shows the text.
+::testing::AssertionResult Contains(const std::string &text, const std::string &part);
 // Whether `folder` holds two files whose names differ only in letter case as two files.
 bool IsCaseSensitive(const std::filesystem::path &folder);
 // Whether `path` can be written to by its owner.
