@@ -44,7 +44,6 @@ TEST_F(Keeping, AnUnloadPutsBackTheFileOfTheFolderLoadedLast) {
   Click("N-B");
   EXPECT_FALSE(game.Exists("sky.spt"));
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
-  EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
 TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
@@ -72,7 +71,6 @@ TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
   EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
   EXPECT_FALSE(game.Exists("sky.spt"));
   EXPECT_EQ(Mark("N-A") + Mark("N-B"), "");
-  EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
 TEST_F(Keeping, TheNextStartRollsAnInterruptedLoadBack) {
@@ -88,13 +86,11 @@ TEST_F(Keeping, TheNextStartRollsAnInterruptedLoadBack) {
   Restart();
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
   EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
-  for (const char *gone :
-       {"sky.spt", "bases.dat.partial", "ZEP128/FoldersLoaded.txt.partial",
-        "ZEP128/#Selector/journal.txt", "ZEP128/#Selector/originals/G/bases.dat"})
-    EXPECT_FALSE(game.Exists(gone)) << gone;
+  EXPECT_TRUE(
+      game.None({"sky.spt", "bases.dat.partial", "ZEP128/FoldersLoaded.txt.partial",
+                 "ZEP128/#Selector/journal.txt", "ZEP128/#Selector/originals/G/bases.dat"}));
   EXPECT_EQ(Mark("N-A"), "");
   EXPECT_EQ(game.Record(), "\r\n");
-  EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
 // Kills inside loads, unloads and Reset All are swept step by step in crash_steps_test.cpp.
@@ -107,15 +103,13 @@ TEST_F(Keeping, TheNextStartFinishesAnInterruptedMusicSwitch) {
   EXPECT_EQ(game.Read("Music/b.bgm"), "chosen");
   EXPECT_EQ(game.Read("Set0/a.bgm"), "active");
   EXPECT_FALSE(game.Exists("ZEP128/#Selector/music.txt"));
-  EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
 TEST_F(Keeping, AFolderGoneFromTheLibraryOrPartlyLoadedIsSaidSo) {
   fs::remove_all(game.Path() / "ZEP128/N-C");
   Click("N-C");
   EXPECT_EQ(Mark("N-C"), "");
-  ASSERT_EQ(failures.Lines().size(), 1u);
-  EXPECT_NE(failures.Lines()[0].find("is no longer in the library"), std::string::npos);
+  EXPECT_TRUE(OneFailure(Taken(), "is no longer in the library"));
 
   game.MakeFolder("sky.spt.partial/in the way");
   game.MakeFolder("sky.spt/in the way");
@@ -123,6 +117,7 @@ TEST_F(Keeping, AFolderGoneFromTheLibraryOrPartlyLoadedIsSaidSo) {
   EXPECT_EQ(Mark("N-B"), "S");
   EXPECT_EQ(partly.Lines().size(), 1u);
   EXPECT_EQ(partly.HeadingOr("").find("\"N-B\" is only partly loaded"), 0u);
+  Taken();
 }
 
 TEST_F(Keeping, ACopyThatFailsAfterItsOriginalWasKeptPutsTheOriginalBackAtOnce) {
@@ -134,8 +129,7 @@ TEST_F(Keeping, ACopyThatFailsAfterItsOriginalWasKeptPutsTheOriginalBackAtOnce) 
   Click("N-A");
   SetStepHook({});
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
-  EXPECT_NE(failures.Message("").find("bases.dat: is the game's own file again"), std::string::npos)
-      << failures.Message("");
+  EXPECT_TRUE(Contains(Taken().Message(""), "bases.dat: is the game's own file again"));
   Click("N-A");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
 }
@@ -150,8 +144,8 @@ TEST_F(Keeping, ACopyThatCannotBeDeletedStaysListedIsTriedAgainAndIsNoOriginal) 
     // The game holds sky.spt open; here something that cannot be deleted takes its place.
     fs::remove(game.Path() / "sky.spt");
     game.Write("sky.spt/held");
-    const Failures held = Click("N-C").failures;
-    EXPECT_NE(held.Message("").find("sky.spt"), std::string::npos);
+    Click("N-C");
+    EXPECT_TRUE(OneFailure(Taken(), "sky.spt"));
     fs::remove_all(game.Path() / "sky.spt");
     game.Write("sky.spt", "N-C"); // released
     if (time == 0) {
@@ -174,12 +168,10 @@ TEST_F(Keeping, AnOldRecordGivesTheLedgerOnceAndTheLedgerWinsAtEveryStart) {
   game.Write("sky.spt", "N-A");
   game.WithRecord("N-A\r\nS-X\r\nS-Y\r\n\r\n");
   Restart();
-  ASSERT_EQ(failures.Lines().size(), 1u);
-  EXPECT_NE(failures.Lines()[0].find("earlier version"), std::string::npos);
+  EXPECT_TRUE(OneFailure(Taken(), "earlier version"));
   // Two folders of a one-per-category letter have copies in the game: both show loaded.
   EXPECT_EQ(Mark("N-A") + Mark("S-X") + Mark("S-Y"), "SSS");
-  Restart();
-  EXPECT_EQ(failures.Lines().size(), 1u);
+  Restart(); // the ledger now says so, without a word
   Click("S-X");
   Click("S-Y");
   EXPECT_FALSE(game.Exists("x.dat") || game.Exists("y.dat"));
@@ -187,11 +179,11 @@ TEST_F(Keeping, AnOldRecordGivesTheLedgerOnceAndTheLedgerWinsAtEveryStart) {
   game.WithRecord("N-B\r\n\r\n");
   Restart();
   EXPECT_EQ(Mark("N-A") + "|" + Mark("N-B"), "S|");
-  EXPECT_NE(failures.Lines().back().find("\"N-A\" is loaded. \"N-B\" is not loaded."),
-            std::string::npos);
+  EXPECT_TRUE(OneFailure(Taken(), "\"N-A\" is loaded. \"N-B\" is not loaded."));
   game.WithRecord("\r\n");
   Restart();
   EXPECT_EQ(Mark("N-A"), "S");
+  EXPECT_TRUE(OneFailure(Taken(), "\"N-A\" is loaded."));
   Click("N-A");
   EXPECT_FALSE(game.Exists("sky.spt"));
 }
@@ -205,14 +197,12 @@ TEST_F(Keeping, ResetAllUnloadsEveryFolderInEveryPlaceThenDeletesTheOtherMatches
   EXPECT_EQ(selector->ResetAllFiles(failures), std::vector<std::string>{"readme.txt"});
   EXPECT_EQ(selector->ResetAllLoadedFiles(failures), 5);
   Gather(selector->ResetAll({"readme.txt"}));
-  for (const char *gone : {"notes.xyz", "Music/tune.bgm", "sky.spt", "readme.txt"})
-    EXPECT_FALSE(game.Exists(gone)) << gone;
+  EXPECT_TRUE(game.None({"notes.xyz", "Music/tune.bgm", "sky.spt", "readme.txt"}));
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
   EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
   Click("N-A"); // a load and an unload after a Reset All
   Click("N-A");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
-  EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
 TEST_F(Keeping, AKeptOriginalIsNeverOverwrittenAndAFolderThatLeftTheLibraryStillUnloads) {
@@ -220,7 +210,7 @@ TEST_F(Keeping, AKeptOriginalIsNeverOverwrittenAndAFolderThatLeftTheLibraryStill
   Click("N-A");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
   EXPECT_EQ(game.Read("ZEP128/#Selector/originals/G/bases.dat"), "kept before");
-  EXPECT_NE(failures.Message("").find("bases.dat: not copied"), std::string::npos);
+  EXPECT_TRUE(OneFailure(Taken(), "bases.dat: not copied"));
   fs::remove_all(game.Path() / "ZEP128/N-A");
   Click("N-A");
   EXPECT_FALSE(game.Exists("sky.spt"));
@@ -241,8 +231,9 @@ TEST_F(Keeping, WhatCouldNotBeTakenOutStaysListedThroughCrashes) {
   SetStepHook([] { throw 0; });
   EXPECT_ANY_THROW(Click("N-C")); // killed once its journal is written
   SetStepHook({});
-  Restart();    // nor can the recovery delete c.dat
-  Click("N-A"); // nor put back the original of bases.dat
+  Restart();                             // nor can the recovery delete c.dat
+  Click("N-A");                          // nor put back the original of bases.dat
+  EXPECT_EQ(Taken().Lines().size(), 2u); // each named once
   for (const std::string name : {"bases.dat", "c.dat"}) {
     fs::remove_all(game.Path() / name);
     game.Write(name, "a copy, released");

@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <memory>
+#include <utility>
 
 // Adds what a verb could not do to `failures`, one collector for a test's run; returns the outcome.
 inline Outcome Gathered(Outcome outcome, Failures &failures) {
@@ -30,6 +31,10 @@ protected:
   Outcome Click(const std::string &folder) { return ClickFolder(*selector, folder, failures); }
   std::string Mark(const std::string &folder) const { return MarkOf(*selector, folder); }
   Outcome Gather(Outcome outcome) { return Gathered(std::move(outcome), failures); }
+  // A failure that the test did not take fails it.
+  void TearDown() override { EXPECT_TRUE(failures.Empty()) << failures.Message(""); }
+  // The failures gathered so far, which the test expects.
+  Failures Taken() { return std::exchange(failures, Failures{}); }
   // A new start of the program on the same game folder.
   void Restart() {
     selector = std::make_unique<Selector>(game.Path(), caption, starter);
