@@ -2,8 +2,6 @@
 
 #include <algorithm>
 
-namespace fs = std::filesystem;
-
 const GameFolder &GameFolder::WithGameFolders() const {
   MakeFolder("Savedata");
   MakeFolder("Music");
@@ -42,7 +40,7 @@ bool RecordingCaption::Showed(const std::string &line) const {
 }
 
 std::vector<std::string> RowNames(const FolderGrid &grid, bool marks) {
-  std::vector<std::string> names;
+  Names names;
   for (int row = 0; row < grid.RowCount(); ++row)
     names.push_back(grid.Row(row).name + (marks && IsLoaded(grid.Row(row)) ? " [S]" : ""));
   return names;

@@ -6,8 +6,6 @@
 
 #include <algorithm>
 
-using Names = std::vector<std::string>;
-
 using GridRules = SelectorTest;
 
 // A category letter, and whether it allows several loaded folders at once.

@@ -4,9 +4,6 @@
 
 #include <gtest/gtest.h>
 
-namespace fs = std::filesystem;
-using Names = std::vector<std::string>;
-
 using GridClick = SelectorTest;
 using CategoryView = SelectorTest;
 using Refresh = SelectorTest;
@@ -60,19 +57,19 @@ TEST_F(CategoryView, LettersBeyondAsciiListTheirFoldersAndNoLetterListsTheProgra
   Gather(selector->StartUp());
   const auto shown = [&](int entry) {
     selector->ShowCategory(entry);
-    std::vector<std::string> names;
+    Names names;
     for (const GridRow &row : selector->State().Unigrid.rows)
       if (row.shown)
         names.push_back(row.name);
     return names;
   };
-  EXPECT_EQ(selector->State().Codes, (std::vector<std::string>{"\xC3\x84", "#", "\xC3\x96"}));
+  EXPECT_EQ(selector->State().Codes, (Names{"\xC3\x84", "#", "\xC3\x96"}));
 #ifndef _WIN32
-  EXPECT_EQ(shown(2), (std::vector<std::string>{"\xC3\x84-utf8", "\xC4-latin"}));
+  EXPECT_EQ(shown(2), (Names{"\xC3\x84-utf8", "\xC4-latin"}));
   EXPECT_EQ(shown(0).size(), 4u);
 #endif
-  EXPECT_EQ(shown(3), std::vector<std::string>{"#-mine"});
-  EXPECT_EQ(shown(4), std::vector<std::string>{"\xC3\x96-other"});
+  EXPECT_EQ(shown(3), Names{"#-mine"});
+  EXPECT_EQ(shown(4), Names{"\xC3\x96-other"});
 }
 
 // Typing goes to the next shown row from the one given, round past the end, in any letter case.

@@ -5,8 +5,6 @@
 
 #include <gtest/gtest.h>
 
-namespace fs = std::filesystem;
-
 namespace {
 
 // A game whose library has three sound folders (several may be loaded) that share "sky.spt",
@@ -61,8 +59,8 @@ TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
   Click("N-A");
   Click("N-B");
   // The loaded folders' files are counted, not listed among the other matches.
-  const std::vector<std::string> names = selector->ResetAllFiles(failures);
-  EXPECT_EQ(names, std::vector<std::string>{});
+  const Names names = selector->ResetAllFiles(failures);
+  EXPECT_EQ(names, Names{});
   EXPECT_EQ(selector->ResetAllLoadedFiles(failures), 3);
   // Gone while the player was asked: neither a failure nor a deletion.
   fs::remove(game.Path() / "sky.spt");
@@ -194,7 +192,7 @@ TEST_F(Keeping, ResetAllUnloadsEveryFolderInEveryPlaceThenDeletesTheOtherMatches
   Click("N-A");
   Click("N-B");
   game.Write("readme.txt", "another match");
-  EXPECT_EQ(selector->ResetAllFiles(failures), std::vector<std::string>{"readme.txt"});
+  EXPECT_EQ(selector->ResetAllFiles(failures), Names{"readme.txt"});
   EXPECT_EQ(selector->ResetAllLoadedFiles(failures), 5);
   Gather(selector->ResetAll({"readme.txt"}));
   EXPECT_TRUE(game.None({"notes.xyz", "Music/tune.bgm", "sky.spt", "readme.txt"}));

@@ -8,9 +8,6 @@
 
 #include <gtest/gtest.h>
 
-namespace fs = std::filesystem;
-using Lines = std::vector<std::string>;
-
 namespace {
 
 // The state after the library is prepared and the grid built, before the record is replayed.
@@ -32,7 +29,7 @@ TEST(LibraryModel, GridFollowsCategoryLinesThenNames) {
     game.MakeFolder(std::string("ZEP128/") + name);
   Failures failures;
   const SelectorState state = PreparedState(game, failures);
-  EXPECT_EQ(RowNames(state.Unigrid), (Lines{"S a", "S-b", "SkinFolder2", "Sunset", "C-camp", "S a",
+  EXPECT_EQ(RowNames(state.Unigrid), (Names{"S a", "S-b", "SkinFolder2", "Sunset", "C-camp", "S a",
                                             "S-b", "SkinFolder2", "Sunset", "s-low"}));
   EXPECT_EQ(state.Unigrid.PathOf(4), game.Path() / "ZEP128" / "C-camp");
   EXPECT_FALSE(state.Unigrid.Row(4).loaded);
@@ -48,7 +45,7 @@ TEST(LibraryModel, RecordHoldsLoadedNamesInRowOrderAndIsReplayed) {
   game.WithRecord("N-c\n\nS-one\r\nGone\r\n\r\n");
   ReplayRecord(state, failures);
   EXPECT_EQ(RowNames(state.Unigrid, true),
-            (Lines{"S-one [S]", "S-one [S]", "N-a", "N-b", "N-c [S]"}));
+            (Names{"S-one [S]", "S-one [S]", "N-a", "N-b", "N-c [S]"}));
   EXPECT_EQ(state.Unigrid.currentRow, 1); // the last recorded row
   // The replay leaves the record as it was; the record names a folder of two rows once.
   EXPECT_EQ(game.Record(), "N-c\n\nS-one\r\nGone\r\n\r\n");
@@ -85,7 +82,7 @@ TEST(LibraryModel, LibraryFilesAreFoundWhateverTheirCase) {
   ReplayRecord(state, failures);
   EXPECT_EQ(state.List3.size(), 3u);
   EXPECT_TRUE(state.Unigrid.Row(0).loaded);
-  EXPECT_EQ(ListFiles(game.Path() / "zep128"), (Lines{"foldersloaded.TXT", "ZEP.INI"}));
+  EXPECT_EQ(ListFiles(game.Path() / "zep128"), (Names{"foldersloaded.TXT", "ZEP.INI"}));
   EXPECT_EQ(ListFolders(game.Path()).size(), 1u);
 }
 
@@ -103,11 +100,11 @@ TEST(CategoryFile, DefaultFileIsWrittenOnceByteForByte) {
   game.WithCategories("Mine: Q\r\n");
   PrepareLibrary(state, failures);
   EXPECT_EQ(game.Read("ZEP128/zep.ini"), "Mine: Q\r\n");
-  EXPECT_EQ(state.List3, (Lines{"Show ALL", "Show Selections", "Mine"}));
+  EXPECT_EQ(state.List3, (Names{"Show ALL", "Show Selections", "Mine"}));
 }
 
 TEST(CategoryFile, OddLinesAreSkippedAndNamed) {
-  Lines lines = {"Maps: time: M", "no colon here", "Blank letter: ", "Unix line: U"};
+  Names lines = {"Maps: time: M", "no colon here", "Blank letter: ", "Unix line: U"};
   for (int i = 0; i < 260; ++i)
     lines.push_back("Extra: E");
   const Categories categories = ParseCategories(lines);

@@ -6,8 +6,6 @@
 
 namespace {
 
-using Names = std::vector<std::string>;
-
 // Set1 and Set2 have folders of their own; Set3 is the game's "Music".
 void MakeThreeSets(const TestFolder &game) {
   game.Write("MUSIC.INI", "Set1\r\nSet2\r\nSet3\r\n");

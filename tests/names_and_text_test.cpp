@@ -5,8 +5,6 @@
 #include "base/plain_name.h"
 #include "base/text_encoding.h"
 #include "base/text_file.h"
-#include "library/ledger_check.h"
-#include "library/move_out.h"
 #include "library/reset_all.h"
 #include "tests/selector_fixture.h"
 
@@ -15,15 +13,12 @@
 #include <algorithm>
 #include <tuple>
 
-namespace fs = std::filesystem;
-using Lines = std::vector<std::string>;
-
 TEST(TextFile, EveryKindOfLineEndEndsALine) {
-  EXPECT_EQ(SplitLines("a\r\nb\rc\nd"), (Lines{"a", "b", "c", "d"}));
-  EXPECT_EQ(SplitLines("a\r\n\r\nb\r\n"), (Lines{"a", "", "b"}));
-  EXPECT_EQ(SplitLines("\n\n"), (Lines{"", ""}));
-  EXPECT_EQ(SplitLines(""), Lines{});
-  EXPECT_EQ(SplitLines("x\xff\x01y"), Lines{"x\xff\x01y"});
+  EXPECT_EQ(SplitLines("a\r\nb\rc\nd"), (Names{"a", "b", "c", "d"}));
+  EXPECT_EQ(SplitLines("a\r\n\r\nb\r\n"), (Names{"a", "", "b"}));
+  EXPECT_EQ(SplitLines("\n\n"), (Names{"", ""}));
+  EXPECT_EQ(SplitLines(""), Names{});
+  EXPECT_EQ(SplitLines("x\xff\x01y"), Names{"x\xff\x01y"});
 }
 
 TEST(TextFile, AtomicWriteReplacesWholeOrLeavesTheOldFile) {
@@ -78,7 +73,7 @@ TEST(Listing, PatternsMatchLikeWindowsIgnoringCase) {
 TEST(Listing, ALargeFolderComesInTheSameOrder) {
   // Enough names, sharing long beginnings, to be sorted byte by byte rather than compared.
   TestFolder folder;
-  Lines names;
+  Names names;
   for (int i = 0; i < 150; ++i)
     for (const char *stem : {"Addon ", "addon_", "ADDON-A", "b"})
       names.push_back(stem + std::to_string(i * 7 % 150) + ".dat");
@@ -97,10 +92,10 @@ TEST(Listing, FilesAndFoldersComeInOneNameOrder) {
     folder.Write(name);
   folder.MakeFolder("sub.dat");
   // Where letter case makes no difference, "a.DAT" was written into "A.dat".
-  const Lines dat =
-      IsCaseSensitive(folder.Path()) ? Lines{"A.dat", "a.DAT", "b.dat"} : Lines{"A.dat", "b.dat"};
+  const Names dat =
+      IsCaseSensitive(folder.Path()) ? Names{"A.dat", "a.DAT", "b.dat"} : Names{"A.dat", "b.dat"};
   EXPECT_EQ(ListFiles(folder.Path(), "*.dat"), dat);
-  Lines all = dat;
+  Names all = dat;
   all.insert(all.end(), {"c.txt", "mypic"});
   EXPECT_EQ(ListFiles(folder.Path()), all);
   EXPECT_TRUE(ListFiles(folder.Path() / "missing").empty());
@@ -109,10 +104,10 @@ TEST(Listing, FilesAndFoldersComeInOneNameOrder) {
     folder.MakeFolder(std::string("lib/") + name);
   folder.Write("lib/file");
   const std::vector<fs::path> folders = ListFolders(folder.Path() / "lib");
-  std::vector<std::string> names;
+  Names names;
   for (const fs::path &path : folders)
     names.push_back(path.filename().string());
-  EXPECT_EQ(names, (Lines{"C x", "F-z", "s-a", "S-b"}));
+  EXPECT_EQ(names, (Names{"C x", "F-z", "s-a", "S-b"}));
   EXPECT_EQ(folders[0], folder.Path() / "lib" / "C x");
 }
 
@@ -161,30 +156,15 @@ TEST(NameCase, AFolderIndexFindsEachFileThatFoldsLikeAWantedName) {
   for (const char *name :
        {"\xE2\x84\xAA.dat", "\xC5\xBF.dat", "k.DAT", "s.dat", "\xC3\x84rmel.dat", "armel.dat"})
     folder.Write(name);
-  const Lines wanted = {"K.dat", "S.DAT", "\xC3\xA4RMEL.DAT", "ARMEL.DAT", "x.dat"};
+  const Names wanted = {"K.dat", "S.DAT", "\xC3\xA4RMEL.DAT", "ARMEL.DAT", "x.dat"};
   const NameIndex index(folder.Path(), wanted);
   for (const std::string &name : wanted) {
-    Lines folded;
+    Names folded;
     for (const std::string &listed : ListFiles(folder.Path()))
       if (FoldName(listed) == FoldName(name))
         folded.push_back(listed);
     EXPECT_EQ(index.Matches(name), folded) << name;
   }
-}
-
-TEST(NameCase, UnloadFindsACopyWhoseNameDiffersBeyondAscii) {
-  GameFolder game;
-  game.Addon("S-Cloth", {"ärmel.dat", "Öl.msn"});
-  game.Write("ÄRMEL.DAT");
-  game.Write("Savedata/öL.MSN");
-  LibraryState state = LibraryFor(game.Path());
-  RecordingCaption caption;
-  Failures failures, notice;
-  game.WithRecord("S-Cloth\r\n");
-  MendRecordFromLedger(state, caption, notice);
-  MoveOut(state, game.Library() / "S-Cloth", caption, failures);
-  EXPECT_TRUE(game.None({"ÄRMEL.DAT", "Savedata/öL.MSN"}));
-  EXPECT_TRUE(failures.Empty());
 }
 
 using Windows1252Files = SelectorTest;
@@ -202,11 +182,11 @@ TEST_F(Windows1252Files, NameTheFoldersAndFilesTheyMean) {
   Gather(selector->StartUp());
   const SelectorState &state = selector->State();
   EXPECT_EQ(state.List3.back(), "Skins f\xC3\xBCr alle");
-  EXPECT_EQ(RowNames(state.Unigrid, true), Lines{"S-J\xC3\xA4ger [S]"});
+  EXPECT_EQ(RowNames(state.Unigrid, true), Names{"S-J\xC3\xA4ger [S]"});
   EXPECT_EQ(selector->HoverRow(0)->description,
             "\xE2\x80\x9CGr\xC3\xBCn\xE2\x80\x9D \xE2\x82\xAC\r\n");
-  EXPECT_EQ(selector->MusicSets(failures).entries, Lines{"Kl\xC3\xA4nge"});
-  EXPECT_EQ(CleanUpNames(state, failures), Lines{"alt.d\xC3\xA4t"});
+  EXPECT_EQ(selector->MusicSets(failures).entries, Names{"Kl\xC3\xA4nge"});
+  EXPECT_EQ(CleanUpNames(state, failures), Names{"alt.d\xC3\xA4t"});
   // Only the notice that the record from before the ledger gave the ledger.
   EXPECT_TRUE(OneFailure(Taken(), "earlier version"));
 }

@@ -4,8 +4,6 @@
 
 #include <gtest/gtest.h>
 
-namespace fs = std::filesystem;
-
 TEST(Preview, RebuiltOnlyWhenThePointerEntersAnotherRow) {
   GameFolder game;
   RecordingCaption caption;

@@ -22,7 +22,7 @@ TEST_F(Refusals, FoldersTheGameNeedsAreNoMusicSets) {
   game.Write("Set1/a.bgm");
   game.Write("Music/b.bgm");
   const MusicList music = selector->MusicSets(failures);
-  EXPECT_EQ(music.entries, std::vector<std::string>{"Set1"});
+  EXPECT_EQ(music.entries, Names{"Set1"});
   EXPECT_EQ(music.current, "Set2");
   EXPECT_FALSE(Gather(selector->SwitchMusic("Set2", "zep128")).done);
   EXPECT_FALSE(Gather(selector->SwitchMusic("Savedata", "Set1")).done);

@@ -7,10 +7,6 @@
 
 #include <gtest/gtest.h>
 
-namespace fs = std::filesystem;
-
-using Names = std::vector<std::string>;
-
 namespace {
 
 // The game folder of the usual example, a few more names, and a library with one loaded folder.

@@ -4,8 +4,6 @@
 
 namespace {
 
-using Names = std::vector<std::string>;
-
 // A library of skins (one loaded at a time), sounds (any number) and campaigns; "n.wav" is in
 // both sounds, "shared.dat" in a skin and a sound.
 class Setups : public SelectorTest {

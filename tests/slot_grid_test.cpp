@@ -9,14 +9,12 @@
 
 #include <gtest/gtest.h>
 
-namespace fs = std::filesystem;
-
 namespace {
 
 // A description file with the aircraft, the slot and whatever lines from 166 on.
 std::string Description(const std::string &aircraft, const std::string &slot,
-                        const std::vector<std::string> &skinLines) {
-  std::vector<std::string> lines(165, "0");
+                        const Names &skinLines) {
+  Names lines(165, "0");
   lines[0] = aircraft;
   lines[1] = slot;
   lines.insert(lines.end(), skinLines.begin(), skinLines.end());
@@ -64,7 +62,7 @@ TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
   ReplayRecord(state, failures);
   EXPECT_TRUE(state.Slots.frameVisible);
   EXPECT_EQ(state.Slots.label, "F-Pack: a.zep");
-  EXPECT_EQ(RowNames(state.Unigrid, true), (std::vector<std::string>{"F-Pack [S]", "F-Plain [S]"}));
+  EXPECT_EQ(RowNames(state.Unigrid, true), (Names{"F-Pack [S]", "F-Plain [S]"}));
   EXPECT_TRUE(failures.Empty());
 }
 

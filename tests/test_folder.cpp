@@ -13,8 +13,6 @@
 #include <windows.h>
 #endif
 
-namespace fs = std::filesystem;
-
 TestFolder::TestFolder() {
   static std::atomic<int> counter{0};
   path_ = fs::temp_directory_path() /

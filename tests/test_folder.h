@@ -6,6 +6,11 @@
 #include <initializer_list>
 #include <map>
 #include <string>
+#include <vector>
+
+namespace fs = std::filesystem;
+// Names as the tests compare them: of files, folders, rows or lines.
+using Names = std::vector<std::string>;
 
 // A fresh folder under the system's temporary folder, removed with everything in it at the end.
 class TestFolder {
