@@ -1,10 +1,6 @@
-#include "base/names.h"
-#include "library/reset_all.h"
 #include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
-
-#include <algorithm>
 
 using GridRules = SelectorTest;
 
@@ -53,29 +49,4 @@ TEST_F(GridRules, ACampaignUnloadedCarriesHomeItsSaveFilesOnly) {
     EXPECT_FALSE(game.Exists(gone)) << gone;
   EXPECT_EQ(game.Read("Savedata/mine.msn"), "the player's");
   EXPECT_EQ(game.Record(), "\r\n");
-}
-
-TEST_F(GridRules, ResetAllHonoursEveryDefaultPattern) {
-  // One name per default pattern ("P.bmp": a star matching an empty run), and names that only
-  // look alike. (".bgm" would do too, but Wine hides names that start with a dot.)
-  const Names deleted = {"a.bgm",    "a.fnt",   "a.wsd", "a.fsp", "a.pal", "a.bak", "a.tco",
-                         "a.pco",    "a.bco",   "a.hm",  "a.jpg", "a.pcx", "a.txt", "mypic",
-                         "planepic", "skinpic", "a.mnu", "a.dat", "a.mpc", "a.wsp", "a.pic",
-                         "a.spt",    "a.str",   "a.ter", "a.tm",  "a.tpc", "a.flt", "a.3dz",
-                         "a.snd",    "a.bil",   "a.bin", "a.cpt", "P.bmp", "a.smk"};
-  const Names kept = {"title.bmp", "mypicture", "a.tmx", "eaw.exe", "Hof.Dat"};
-  for (const std::string &name : deleted)
-    game.Write(name);
-  for (const std::string &name : kept)
-    game.Write(name);
-  game.WithRecord("");
-  Names expected = deleted;
-  std::sort(expected.begin(), expected.end(),
-            [](const std::string &a, const std::string &b) { return NameLess(a, b); });
-  EXPECT_EQ(selector->ResetAllFiles(failures), expected);
-  Gather(selector->ResetAll(expected));
-  for (const std::string &name : kept)
-    EXPECT_TRUE(game.Exists(name)) << name;
-  for (const std::string &name : deleted)
-    EXPECT_FALSE(game.Exists(name)) << name;
 }

@@ -1,7 +1,6 @@
 #include "app/category_file.h"
 #include "app/startup.h"
 #include "base/listing.h"
-#include "base/text_file.h"
 #include "library/loaded_record.h"
 #include "library/record_replay.h"
 #include "tests/game_folder.h"
@@ -37,24 +36,28 @@ TEST(LibraryModel, GridFollowsCategoryLinesThenNames) {
 
 TEST(LibraryModel, RecordHoldsLoadedNamesInRowOrderAndIsReplayed) {
   GameFolder game;
-  game.WithCategories("Skins: S\nAgain: S\nSounds: N\n");
+  // The library's own files are found whatever their letter case, and never made twice.
+  game.Write("zep128/ZEP.INI", "Skins: S\nAgain: S\nSounds: N\n");
   for (const char *name : {"S-one", "N-a", "N-b", "N-c"})
-    game.MakeFolder(std::string("ZEP128/") + name);
+    game.MakeFolder(std::string("zep128/") + name);
   Failures failures;
   SelectorState state = PreparedState(game, failures);
-  game.WithRecord("N-c\n\nS-one\r\nGone\r\n\r\n");
+  game.Write("zep128/foldersloaded.TXT", "N-c\n\nS-one\r\nGone\r\n\r\n");
+  EnsureRecord(state, failures);
   ReplayRecord(state, failures);
   EXPECT_EQ(RowNames(state.Unigrid, true),
             (Names{"S-one [S]", "S-one [S]", "N-a", "N-b", "N-c [S]"}));
   EXPECT_EQ(state.Unigrid.currentRow, 1); // the last recorded row
   // The replay leaves the record as it was; the record names a folder of two rows once.
-  EXPECT_EQ(game.Record(), "N-c\n\nS-one\r\nGone\r\n\r\n");
+  EXPECT_EQ(game.Read("zep128/foldersloaded.TXT"), "N-c\n\nS-one\r\nGone\r\n\r\n");
   SaveLoaded(state, failures);
-  EXPECT_EQ(game.Record(), "S-one\r\nN-c\r\n\r\n");
+  EXPECT_EQ(game.Read("zep128/foldersloaded.TXT"), "S-one\r\nN-c\r\n\r\n");
   for (GridRow &row : state.Unigrid.rows)
     row.loaded = false;
   SaveLoaded(state, failures);
-  EXPECT_EQ(game.Record(), "\r\n");
+  EXPECT_EQ(game.Read("zep128/foldersloaded.TXT"), "\r\n");
+  EXPECT_EQ(ListFiles(game.Path() / "zep128"), (Names{"foldersloaded.TXT", "ZEP.INI"}));
+  EXPECT_EQ(ListFolders(game.Path()).size(), 1u);
   EXPECT_TRUE(failures.Empty());
 }
 
@@ -71,28 +74,7 @@ TEST(LibraryModel, UnreadableLibraryFilesAreReportedNotFatal) {
   EXPECT_NE(failures.Message("").find("zep.ini"), std::string::npos);
 }
 
-TEST(LibraryModel, LibraryFilesAreFoundWhateverTheirCase) {
-  GameFolder game;
-  game.Write("zep128/ZEP.INI", "Skins: S\r\n");
-  game.Write("zep128/foldersloaded.TXT", "S-a\r\n");
-  game.MakeFolder("zep128/S-a");
-  Failures failures;
-  SelectorState state = PreparedState(game, failures);
-  EnsureRecord(state, failures);
-  ReplayRecord(state, failures);
-  EXPECT_EQ(state.List3.size(), 3u);
-  EXPECT_TRUE(state.Unigrid.Row(0).loaded);
-  EXPECT_EQ(ListFiles(game.Path() / "zep128"), (Names{"foldersloaded.TXT", "ZEP.INI"}));
-  EXPECT_EQ(ListFolders(game.Path()).size(), 1u);
-}
-
-TEST(CategoryFile, DefaultFileIsWrittenOnceByteForByte) {
-  const std::string text = DefaultCategoryText();
-  EXPECT_EQ(SplitLines(text).size(), 27u);
-  EXPECT_EQ(text.substr(0, 28), "Versions of the EAW.exe: E\r\n");
-  EXPECT_EQ(text.substr(text.size() - 17), "Convoy Files: c\r\n");
-  EXPECT_NE(text.find("\r\nLand Height(eaw16.hm): L\r\n"), std::string::npos);
-
+TEST(CategoryFile, ThePlayersFileIsKeptAndListsItsCategories) {
   GameFolder game;
   Failures failures;
   SelectorState state;

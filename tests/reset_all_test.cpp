@@ -34,11 +34,19 @@ TEST_F(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
   ReplayRecord(state, failures);
   ASSERT_TRUE(state.Unigrid.Row(0).loaded);
   state.Slots.frameVisible = true;
+  // One name per default pattern ("P.bmp": a star matching an empty run), and names that only
+  // look alike. (".bgm" would do too, but Wine hides names that start with a dot.)
+  for (const char *name :
+       {"a.bgm", "a.fnt",    "a.wsd",   "a.fsp", "a.pal", "a.bak",     "a.tco", "a.pco", "a.bco",
+        "a.hm",  "a.jpg",    "a.pcx",   "a.txt", "a.mnu", "a.mpc",     "a.wsp", "a.pic", "a.str",
+        "a.ter", "a.tm",     "a.tpc",   "a.flt", "a.3dz", "a.snd",     "a.bil", "a.bin", "a.cpt",
+        "P.bmp", "planepic", "skinpic", "a.smk", "a.spt", "mypicture", "a.tmx"})
+    game.Write(name);
 
   for (int time = 0; time < 2; ++time) {
     ::ResetAll(state, CleanUpNames(state, failures), caption, failures);
-    EXPECT_EQ(ListFiles(game.Path()),
-              (Names{"chatline.txt", "dsg.ico", "eaw.exe", "Extra.Spt", "hof.dat", "title.bmp"}));
+    EXPECT_EQ(ListFiles(game.Path()), (Names{"a.tmx", "chatline.txt", "dsg.ico", "eaw.exe",
+                                             "Extra.Spt", "hof.dat", "mypicture", "title.bmp"}));
     for (const char *kept : {"Savedata/a.dat", "old.dat/inside.txt", "ZEP128/S-Camo/a.txt"})
       EXPECT_TRUE(game.Exists(kept)) << kept;
     EXPECT_TRUE(game.Exists("ZEP128/FoldersLoaded.txt"));
