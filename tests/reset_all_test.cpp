@@ -3,14 +3,14 @@
 #include "app/startup.h"
 #include "base/listing.h"
 #include "library/record_replay.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
 namespace {
 
 // The game folder of the usual example, a few more names, and a library with one loaded folder.
-class ResetAll : public ::testing::Test {
+class ResetAll : public LibraryTest {
 protected:
   void SetUp() override {
     for (const char *name : {"planes.dat", "hof.dat", "readme.txt", "chatline.txt", "pic1.bmp",
@@ -20,11 +20,6 @@ protected:
     game.WithCategories("Skins: S\r\n");
     game.WithRecord("S-Camo\r\n\r\n");
   }
-
-  GameFolder game;
-  LibraryState state = LibraryFor(game.Path());
-  RecordingCaption caption;
-  Failures failures;
 };
 
 } // namespace

@@ -1,6 +1,8 @@
 #pragma once
 
 #include "app/selector.h"
+#include "library/move_in.h"
+#include "library/move_out.h"
 #include "tests/game_folder.h"
 
 #include <gtest/gtest.h>
@@ -45,5 +47,22 @@ protected:
   RecordingCaption caption;
   NotingStarter starter;
   std::unique_ptr<Selector> selector = std::make_unique<Selector>(game.Path(), caption, starter);
+  Failures failures;
+};
+
+// A game folder and the library state that loads and unloads its add-on folders directly.
+class LibraryTest : public ::testing::Test {
+protected:
+  // Whether the folder could be listed, and so was loaded in whole or part.
+  bool Load(const std::string &folder) {
+    return MoveIn(state, game.Library() / folder, caption, failures).has_value();
+  }
+  void Unload(const std::string &folder) {
+    MoveOut(state, game.Library() / folder, caption, failures);
+  }
+
+  GameFolder game;
+  LibraryState state = LibraryFor(game.Path());
+  RecordingCaption caption;
   Failures failures;
 };
