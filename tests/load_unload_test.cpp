@@ -50,7 +50,6 @@ TEST_F(Loading, PutsEachFileWhereTheGameLooksForIt) {
   ASSERT_EQ(caption.progress.size(), 5u);
   EXPECT_EQ(caption.progress.back(), std::make_pair(5, 5));
   EXPECT_EQ(caption.text, "Selector");
-  EXPECT_TRUE(failures.Empty());
 }
 
 TEST_F(Loading, FileThatCannotBeCopiedIsSkippedAndReported) {
@@ -65,7 +64,7 @@ TEST_F(Loading, FileThatCannotBeCopiedIsSkippedAndReported) {
   EXPECT_TRUE(fs::is_directory(game.Path() / "b.dat"));
   EXPECT_FALSE(game.Exists("b.dat.partial"));
   // Where letter case makes no difference, the file "savedata" is the folder "Savedata".
-  const std::string message = Upper(failures.Message(""));
+  const std::string message = Upper(Taken().Message(""));
   for (const char *failed : {"b.dat", "e.msn", "savedata"})
     EXPECT_NE(message.find(Upper(failed)), std::string::npos) << failed;
 }
@@ -73,7 +72,7 @@ TEST_F(Loading, FileThatCannotBeCopiedIsSkippedAndReported) {
 TEST_F(Loading, AFolderThatCannotBeListedIsNotLoadedAndSaysWhy) {
   game.Write("ZEP128/S-File"); // a file where the folder was: it cannot be listed
   EXPECT_FALSE(Load("S-File"));
-  EXPECT_TRUE(OneFailure(failures, "cannot be listed"));
+  EXPECT_TRUE(OneFailure(Taken(), "cannot be listed"));
   EXPECT_FALSE(game.Exists("ZEP128/#Selector/journal.txt"));
 }
 
@@ -94,7 +93,7 @@ TEST_F(Unloading, DeletesOnlyTheCopiesLoadingMade) {
   // letter case makes no difference, "dup.dat" is one file, the copy.
   EXPECT_EQ(game.Exists("DUP.DAT"), IsCaseSensitive(game.Path()));
   EXPECT_TRUE(game.All({"contents.txt", "MYPIC", "pic.jpg", "Savedata/keep.sve"}));
-  EXPECT_TRUE(failures.Empty()); // gone.dat was deleted by hand
+  // gone.dat, deleted by hand, is no failure.
   EXPECT_TRUE(caption.Showed("Deleting PLANES.DAT"));
   EXPECT_EQ(caption.text, "Selector");
   EXPECT_EQ(game.Record(), "\r\n");

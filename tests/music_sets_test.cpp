@@ -1,6 +1,6 @@
 #include "settings/music_sets.h"
 #include "settings/music_switch.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
@@ -23,9 +23,9 @@ void ExpectUntouched(const TestFolder &game) {
 
 } // namespace
 
-TEST(MusicSets, ListsSetsWithFoldersAndShowsTheLastOneWithoutAsCurrent) {
-  GameFolder game;
-  Failures failures;
+using MusicSets = GameTest;
+
+TEST_F(MusicSets, ListsSetsWithFoldersAndShowsTheLastOneWithoutAsCurrent) {
   EXPECT_TRUE(FillMusicList(game.Path(), failures).entries.empty());
   MakeThreeSets(game);
   EXPECT_EQ(FillMusicList(game.Path(), failures).entries, (Names{"Set1", "Set2"}));
@@ -37,26 +37,23 @@ TEST(MusicSets, ListsSetsWithFoldersAndShowsTheLastOneWithoutAsCurrent) {
   EXPECT_EQ(FillMusicList(game.Path(), failures).current, "Gone");
   // "..", ".", "C:x" (another drive on Windows), "a/b" and "a\b", each once.
   ASSERT_EQ(failures.Lines().size(), 5u) << failures.Message("");
-  EXPECT_NE(failures.Lines()[2].find("Music.ini: line 6 was ignored: \"C:x\" is a path"),
-            std::string::npos);
+  EXPECT_TRUE(Contains(Taken().Lines()[2], "Music.ini: line 6 was ignored: \"C:x\" is a path"));
 }
 
-TEST(MusicSets, AFailedSwitchChangesNoFolderAndSaysSo) {
-  GameFolder game;
+TEST_F(MusicSets, AFailedSwitchChangesNoFolderAndSaysSo) {
   MakeThreeSets(game);
   game.Write("NotAFolder", "file");
-  Failures failures;
   EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "NotAFolder", Journal(game), failures));
   EXPECT_FALSE(SwitchMusic(game.Path(), "", "Set1", Journal(game), failures));
   EXPECT_FALSE(SwitchMusic(game.Path(), "Set2", "Set1", Journal(game), failures)); // Set2 is taken
   EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "..", Journal(game), failures));
-  EXPECT_EQ(failures.Lines().size(), 4u);
+  EXPECT_EQ(Taken().Lines().size(), 4u);
   ExpectUntouched(game);
   // Where letter case tells folders apart, a second "MUSIC" would leave the game without music.
   if (IsCaseSensitive(game.Path())) {
     game.MakeFolder("MUSIC");
     EXPECT_FALSE(SwitchMusic(game.Path(), "Set3", "Set1", Journal(game), failures));
-    EXPECT_NE(failures.Lines().back().find("MUSIC is in the way"), std::string::npos);
+    EXPECT_TRUE(OneFailure(Taken(), "MUSIC is in the way"));
     ExpectUntouched(game);
   }
   EXPECT_FALSE(game.Exists("ZEP128/journal"));

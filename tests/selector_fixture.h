@@ -27,31 +27,37 @@ inline std::string MarkOf(const Selector &selector, const std::string &folder) {
   return IsLoaded(grid.Row(RowOf(grid, folder))) ? "S" : "";
 }
 
+// A fresh game folder and one collector of what could not be done: a failure that the test did
+// not take fails it.
+class GameTest : public ::testing::Test {
+protected:
+  void TearDown() override { EXPECT_TRUE(failures.Empty()) << failures.Message(""); }
+  // The failures gathered so far, which the test expects.
+  Failures Taken() { return std::exchange(failures, Failures{}); }
+
+  GameFolder game;
+  RecordingCaption caption;
+  Failures failures;
+};
+
 // A Selector on a fresh game folder, for tests that drive the program's verbs.
-class SelectorTest : public ::testing::Test {
+class SelectorTest : public GameTest {
 protected:
   Outcome Click(const std::string &folder) { return ClickFolder(*selector, folder, failures); }
   std::string Mark(const std::string &folder) const { return MarkOf(*selector, folder); }
   Outcome Gather(Outcome outcome) { return Gathered(std::move(outcome), failures); }
-  // A failure that the test did not take fails it.
-  void TearDown() override { EXPECT_TRUE(failures.Empty()) << failures.Message(""); }
-  // The failures gathered so far, which the test expects.
-  Failures Taken() { return std::exchange(failures, Failures{}); }
   // A new start of the program on the same game folder.
   void Restart() {
     selector = std::make_unique<Selector>(game.Path(), caption, starter);
     Gather(selector->StartUp());
   }
 
-  GameFolder game;
-  RecordingCaption caption;
   NotingStarter starter;
   std::unique_ptr<Selector> selector = std::make_unique<Selector>(game.Path(), caption, starter);
-  Failures failures;
 };
 
 // A game folder and the library state that loads and unloads its add-on folders directly.
-class LibraryTest : public ::testing::Test {
+class LibraryTest : public GameTest {
 protected:
   // Whether the folder could be listed, and so was loaded in whole or part.
   bool Load(const std::string &folder) {
@@ -61,8 +67,5 @@ protected:
     MoveOut(state, game.Library() / folder, caption, failures);
   }
 
-  GameFolder game;
   LibraryState state = LibraryFor(game.Path());
-  RecordingCaption caption;
-  Failures failures;
 };

@@ -5,7 +5,7 @@
 #include "library/grid_click.h"
 #include "library/record_replay.h"
 #include "slots/plane_set.h"
-#include "tests/game_folder.h"
+#include "tests/selector_fixture.h"
 
 #include <gtest/gtest.h>
 
@@ -23,8 +23,9 @@ std::string Description(const std::string &aircraft, const std::string &slot,
 
 } // namespace
 
-TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
-  GameFolder game;
+using SlotGrid = GameTest;
+
+TEST_F(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
   LibraryState state = LibraryFor(game.Path());
   const std::string pack = "ZEP128/F-Pack/";
   game.Write(pack + "P-Lightning/a.zep",
@@ -35,8 +36,6 @@ TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
   game.Write(pack + "Sounds/P-Inner/d.zep", "x");
   game.Write("ZEP128/F-Plain/planes.dat");
   BuildFolderRows(state.Unigrid, {"F"}, state.LibDir, ListFolderNames(state.LibDir));
-  RecordingCaption caption;
-  Failures failures;
 
   library::ClickRow(state, 0, caption, failures); // F-Pack
   EXPECT_TRUE(state.Slots.frameVisible);
@@ -63,15 +62,12 @@ TEST(SlotGrid, FlightModelFolderShowsItsPlaneSetsUntilUnloaded) {
   EXPECT_TRUE(state.Slots.frameVisible);
   EXPECT_EQ(state.Slots.label, "F-Pack: a.zep");
   EXPECT_EQ(RowNames(state.Unigrid, true), (Names{"F-Pack [S]", "F-Plain [S]"}));
-  EXPECT_TRUE(failures.Empty());
 }
 
-TEST(SlotGrid, SkinCodeTakesOnlyCharacterCodesThatExist) {
-  TestFolder folder;
-  folder.Write("P-Short/a.zep", Description("Short", "1", {"112", "51"}));
-  folder.Write("P-Odd/a.zep",
-               Description("Odd", "1", {"\t 112.9", "99999999999999999999999999", "-1", "x"}));
-  Failures failures;
-  EXPECT_EQ(ReadPlaneSet(folder.Path() / "P-Short", failures).skinSlot, "P3");
-  EXPECT_EQ(ReadPlaneSet(folder.Path() / "P-Odd", failures).skinSlot, std::string("P\0", 2));
+TEST_F(SlotGrid, SkinCodeTakesOnlyCharacterCodesThatExist) {
+  game.Write("P-Short/a.zep", Description("Short", "1", {"112", "51"}));
+  game.Write("P-Odd/a.zep",
+             Description("Odd", "1", {"\t 112.9", "99999999999999999999999999", "-1", "x"}));
+  EXPECT_EQ(ReadPlaneSet(game.Path() / "P-Short", failures).skinSlot, "P3");
+  EXPECT_EQ(ReadPlaneSet(game.Path() / "P-Odd", failures).skinSlot, std::string("P\0", 2));
 }
