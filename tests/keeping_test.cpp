@@ -32,7 +32,7 @@ TEST_F(Keeping, AnUnloadPutsBackTheFileOfTheFolderLoadedLast) {
   EXPECT_EQ(Click("N-B").notice, "\"N-B\" replaced files of \"N-A\", which stay loaded. Unloading "
                                  "\"N-B\" puts their files back.\nbases.dat, \"N-A\"'s copy\n"
                                  "sky.spt, \"N-A\"'s copy");
-  EXPECT_NE(Click("N-C").notice.find("replaced files of \"N-B\", which"), std::string::npos);
+  EXPECT_TRUE(Contains(Click("N-C").notice, "replaced files of \"N-B\", which"));
   EXPECT_EQ(game.Read("sky.spt"), "N-C");
   Click("N-C");
   EXPECT_EQ(game.Read("sky.spt"), "N-B");
@@ -59,12 +59,11 @@ TEST_F(Keeping, TheGamesOwnFilesComeBackWhenTheLastFolderGoesAndAfterAReset) {
   Click("N-A");
   Click("N-B");
   // The loaded folders' files are counted, not listed among the other matches.
-  const Names names = selector->ResetAllFiles(failures);
-  EXPECT_EQ(names, Names{});
+  EXPECT_EQ(selector->ResetAllFiles(failures), Names{});
   EXPECT_EQ(selector->ResetAllLoadedFiles(failures), 3);
   // Gone while the player was asked: neither a failure nor a deletion.
   fs::remove(game.Path() / "sky.spt");
-  EXPECT_EQ(Gather(selector->ResetAll(names)).summary, "Reset All: 2 files put back.");
+  EXPECT_EQ(Gather(selector->ResetAll({})).summary, "Reset All: 2 files put back.");
   EXPECT_EQ(game.Read("bases.dat"), kOriginal);
   EXPECT_EQ(game.Read("Savedata/a.msn"), "the player's mission");
   EXPECT_FALSE(game.Exists("sky.spt"));
