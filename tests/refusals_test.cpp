@@ -34,15 +34,6 @@ TEST_F(Refusals, FoldersTheGameNeedsAreNoMusicSets) {
   EXPECT_TRUE(Contains(refused, "\"Savedata\" is a folder"));
 }
 
-TEST_F(Refusals, NamesOfTheLongestLengthAreLoaded) {
-  const std::string name = std::string(246, 'n') + ".dat";
-  game.WithCategories("Skins: S\r\n");
-  game.Write("ZEP128/S-Long/" + name, "long");
-  Gather(selector->StartUp());
-  Gather(selector->ClickRow(0));
-  EXPECT_EQ(game.Read(name), "long");
-}
-
 TEST(Reasons, AFullDiskAHeldFileAndNamesWindowsCannotKeepAreCalledSo) {
   EXPECT_EQ(ReasonOf(std::make_error_code(std::errc::no_space_on_device)), "the disk is full");
 #ifdef _WIN32
