@@ -46,8 +46,8 @@ std::vector<std::string> RowNames(const FolderGrid &grid, bool marks) {
   return names;
 }
 
-int RowOf(const FolderGrid &grid, const std::string &name, int after) {
-  for (int row = after + 1; row < grid.RowCount(); ++row)
+int RowOf(const FolderGrid &grid, const std::string &name) {
+  for (int row = 0; row < grid.RowCount(); ++row)
     if (grid.Row(row).name == name)
       return row;
   return -1;

@@ -65,5 +65,5 @@ public:
 // The names of the grid's folder rows, in row order; with `marks`, a loaded row's name is
 // followed by " [S]".
 std::vector<std::string> RowNames(const FolderGrid &grid, bool marks = false);
-// The first folder row after `after` named `name`, or 0.
-int RowOf(const FolderGrid &grid, const std::string &name, int after = -1);
+// The first row named `name`, or -1.
+int RowOf(const FolderGrid &grid, const std::string &name);
