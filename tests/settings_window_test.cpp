@@ -10,13 +10,6 @@ namespace fs = std::filesystem;
 
 namespace {
 
-void PressEnterIn(WindowDriver &driver, const char *box, const QString &text) {
-  auto *edit = driver.Find<QLineEdit>(box);
-  edit->setFocus();
-  edit->setText(text);
-  QTest::keyClick(edit, Qt::Key_Return);
-}
-
 int StartedCount(const fs::path &folder) {
   int count = 0;
   for (const auto &entry : fs::directory_iterator(folder))
@@ -31,34 +24,31 @@ TEST(SettingsWindow, BoxesShowTheFileAndEnterSavesThemOrSaysWhyNot) {
   GameFolder game;
   game.Write("eaw.ini", "Width=0800\nMonth=abc\nDay=14");
   WindowDriver driver(game.Path());
-  EXPECT_EQ(driver.Find<QLineEdit>("Text5")->text(), "800");
-  EXPECT_EQ(driver.Find<QLineEdit>("Text6")->text(), "");
-  EXPECT_EQ(driver.Find<QLineEdit>("Text4")->text(), "0");
+  EXPECT_EQ(driver.Text("Text5"), "800");
+  EXPECT_EQ(driver.Text("Text6"), "");
+  EXPECT_EQ(driver.Text("Text4"), "0");
 
-  PressEnterIn(driver, "Text7", "");
+  driver.Press("Text7", "");
   EXPECT_EQ(game.Read("eaw.ini"), "Width=800\r\nMonth=0\r\nDay=\r\n");
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
   EXPECT_EQ(driver.Summary(), "3 settings saved to eaw.ini");
 
-  // A temporary name taken by a folder makes the write fail: the file stays as it was.
+  // A temporary name taken by a folder makes the write fail.
   game.Write("eaw.ini.partial/in-the-way");
-  PressEnterIn(driver, "Text5", "640");
-  EXPECT_EQ(game.Read("eaw.ini"), "Width=800\r\nMonth=0\r\nDay=\r\n");
-  const QStringList messages = driver.TakeMessages();
-  ASSERT_EQ(messages.size(), 1);
-  EXPECT_TRUE(messages[0].contains("eaw.ini"));
+  driver.Press("Text5", "640");
+  EXPECT_TRUE(driver.OneMessage({"The settings could not be saved:", "eaw.ini"}));
   EXPECT_EQ(driver.Summary(), kInstructions); // the line of the save before is gone
-  QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
-  EXPECT_TRUE(driver.TakeMessages().join("|").startsWith("The settings file could not be saved:"));
+  driver.Click("InSaver");
+  EXPECT_TRUE(driver.OneMessage({"The settings file could not be saved:"}));
 }
 
-TEST(SettingsWindow, EditorShowsFollowsTheBoxesAsksBeforeSavingOverAChangeAndHides) {
+TEST(SettingsWindow, EditorShowsFollowsTheBoxesAsksBeforeSavingOverAChangeKeepsBytesAndHides) {
   GameFolder game;
   game.Write("eaw.ini", "Width=800\r\nHeight=600\r\n");
   WindowDriver driver(game.Path());
   auto *editor = driver.Find<QWidget>("Frame21");
   driver.Find<QTabWidget>("SSTab1")->setCurrentIndex(0);
-  QTest::mouseClick(driver.Find<QPushButton>("IniEdit"), Qt::LeftButton);
+  driver.Click("IniEdit");
   EXPECT_TRUE(editor->isVisible());
   auto *text = driver.Find<QPlainTextEdit>("Text14");
   EXPECT_EQ(text->toPlainText(), "Width=800\nHeight=600\n");
@@ -66,22 +56,39 @@ TEST(SettingsWindow, EditorShowsFollowsTheBoxesAsksBeforeSavingOverAChangeAndHid
   const QPalette standard = QApplication::style()->standardPalette();
   EXPECT_EQ(editor->palette().color(QPalette::Window), standard.color(QPalette::Window));
   EXPECT_EQ(text->palette().color(QPalette::Base), standard.color(QPalette::Base));
-  PressEnterIn(driver, "Text5", "1024");
+  driver.Press("Text5", "1024");
   EXPECT_EQ(text->toPlainText(), "Width=1024\nHeight=600\n");
 
   text->setPlainText("Width=1280\nHeight=600\nExtra=1\n");
-  PressEnterIn(driver, "Text6", "768");
+  driver.Press("Text6", "768");
   EXPECT_EQ(text->toPlainText(), "Width=1280\nHeight=600\nExtra=1\n");
-  auto *save = driver.Find<QPushButton>("InSaver");
-  EXPECT_EQ(
-      driver.AnswerNextBox(QMessageBox::Cancel, [&] { QTest::mouseClick(save, Qt::LeftButton); }),
-      "eaw.ini has changed since the editor showed it (Height). Save the editor's text over "
-      "it?");
+  EXPECT_EQ(driver.AnswerNextBox(QMessageBox::Cancel, [&] { driver.Click("InSaver"); }),
+            "eaw.ini has changed since the editor showed it (Height). Save the editor's text over "
+            "it?");
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1024\r\nHeight=768\r\n");
-  driver.AnswerNextBox(QMessageBox::Ok, [&] { QTest::mouseClick(save, Qt::LeftButton); });
+  driver.AnswerNextBox(QMessageBox::Ok, [&] { driver.Click("InSaver"); });
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\nHeight=600\r\nExtra=1\r\n\r\n");
-  EXPECT_EQ(driver.Find<QLineEdit>("Text5")->text(), "1280");
+  EXPECT_EQ(driver.Text("Text5"), "1280");
   EXPECT_EQ(driver.Summary(), "eaw.ini saved");
+
+  // An unchanged text is saved byte for byte: a byte-order mark, no-break spaces and Unicode line
+  // and paragraph separators in UTF-8, then curly quotes and a no-break space in Windows-1252.
+  for (const std::string &ini : {std::string("\xEF\xBB\xBFWidth=800\xC2\xA0\r\nName=a\xE2\x80\xA8"
+                                             "b\xE2\x80\xA9"
+                                             "c\r\n"),
+                                 std::string("Pilot=\x93"
+                                             "Ace\x94\xA0\x81\r\n")}) {
+    game.Write("eaw.ini", ini);
+    driver.Click("IniEdit");
+    driver.Click("InSaver");
+    EXPECT_EQ(game.Read("eaw.ini"), ini + "\r\n");
+  }
+  EXPECT_TRUE(text->toPlainText().startsWith(QString::fromUtf8("Pilot=\u201CAce\u201D")));
+  text->moveCursor(QTextCursor::End);
+  text->insertPlainText("Day=3\n");
+  driver.Click("InSaver");
+  EXPECT_EQ(game.Read("eaw.ini"), "Pilot=\x93"
+                                  "Ace\x94\xA0\x81\r\nDay=3\r\n\r\n");
   QTest::mouseClick(editor, Qt::LeftButton, {}, QPoint(editor->width() - 5, editor->height() - 5));
   EXPECT_FALSE(editor->isVisible());
 }
@@ -94,27 +101,20 @@ TEST(SettingsWindow, MusicListSwitchesThereAndBack) {
   game.Write("Classic/classic.bgm");
   WindowDriver driver(game.Path());
   auto *list = driver.Find<QListWidget>("List4");
-  auto *current = driver.Find<QLabel>("Label11");
   ASSERT_EQ(list->count(), 2);
   EXPECT_EQ(list->item(0)->text(), "Swing");
-  EXPECT_EQ(current->text(), "Rock");
+  EXPECT_EQ(driver.Text("Label11"), "Rock");
 
-  QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
-                    list->visualItemRect(list->item(0)).center());
-  EXPECT_TRUE(game.Exists("Music/swing.bgm"));
-  EXPECT_EQ(current->text(), "Swing");
+  driver.ClickEntry("List4", 0);
+  EXPECT_EQ(driver.Text("Label11"), "Swing");
   // The line ".." is named once, at the start, and not again at each switch.
-  const QStringList messages = driver.TakeMessages();
-  ASSERT_EQ(messages.size(), 1);
-  EXPECT_TRUE(messages[0].contains("line 2 was ignored")) << messages[0].toStdString();
+  EXPECT_TRUE(driver.OneMessage({"line 2 was ignored"}));
   EXPECT_EQ(driver.Summary(), "Music set Swing is playing");
   ASSERT_EQ(list->count(), 2);
   EXPECT_EQ(list->item(1)->text(), "Rock");
 
-  QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
-                    list->visualItemRect(list->item(1)).center());
-  EXPECT_TRUE(game.Exists("Music/rock.bgm"));
-  EXPECT_EQ(current->text(), "Rock");
+  driver.ClickEntry("List4", 1);
+  EXPECT_EQ(driver.Text("Label11"), "Rock");
 }
 
 // POSIX only: names there are bytes, which need not be text; Windows names are UTF-16 text.
@@ -126,12 +126,9 @@ TEST(SettingsWindow, MusicSetNamesThatAreNotTextKeepTheirBytes) {
   game.Write("Music/rock.bgm");
   game.Write(latin1 + "/klang.bgm");
   WindowDriver driver(game.Path());
-  auto *list = driver.Find<QListWidget>("List4");
   for (int time = 0; time < 2; ++time)
-    QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
-                      list->visualItemRect(list->item(0)).center());
-  EXPECT_TRUE(game.Exists(latin1 + "/klang.bgm"));
-  EXPECT_TRUE(game.Exists("Music/rock.bgm"));
+    driver.ClickEntry("List4", 0);
+  EXPECT_TRUE(game.All({latin1 + "/klang.bgm", "Music/rock.bgm"}));
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 }
 #endif
@@ -139,52 +136,23 @@ TEST(SettingsWindow, MusicSetNamesThatAreNotTextKeepTheirBytes) {
 TEST(SettingsWindow, FlyStartsTheGameEachTimeOrSaysWhyNotAndTellsAQuickFailureOnce) {
   GameFolder game;
   WindowDriver driver(game.Path());
-  auto *fly = driver.Find<QPushButton>("delmsn");
-  QTest::mouseClick(fly, Qt::LeftButton);
+  driver.Click("delmsn");
   const QStringList messages = driver.TakeMessages();
   ASSERT_EQ(messages.size(), 1);
   EXPECT_TRUE(messages[0].contains(QString::fromStdString((game.Path() / "eaw.exe").string())));
   EXPECT_EQ(messages[0].count("started"), 1); // said once
 
   MakeStandInGame(game);
-  QTest::mouseClick(fly, Qt::LeftButton);
-  QTest::mouseClick(fly, Qt::LeftButton);
+  driver.Click("delmsn");
+  driver.Click("delmsn");
   EXPECT_TRUE(QTest::qWaitFor([&] { return StartedCount(game.Path()) == 2; }, 5000));
   EXPECT_EQ(driver.Summary(), "Game started");
   EXPECT_TRUE(driver.Window().isVisible());
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 
   MakeStandInGame(game, 3);
-  QTest::mouseClick(fly, Qt::LeftButton);
-  QStringList failed;
-  EXPECT_TRUE(QTest::qWaitFor([&] { return !(failed = driver.TakeMessages()).isEmpty(); }));
-  ASSERT_EQ(failed.size(), 1);
-  EXPECT_TRUE(failed[0].contains("status 3")) << failed[0].toStdString();
+  driver.Click("delmsn");
+  EXPECT_TRUE(QTest::qWaitFor([&] { return driver.OneMessage({"status 3"}); }));
   QTest::qWait(300);
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
-}
-
-TEST(SettingsWindow, EditorSavesUnchangedTextByteForByte) {
-  GameFolder game;
-  WindowDriver driver(game.Path());
-  auto *text = driver.Find<QPlainTextEdit>("Text14");
-  // A byte-order mark, no-break spaces and Unicode line and paragraph separators in UTF-8, then
-  // curly quotes and a no-break space in Windows-1252.
-  for (const std::string &ini : {std::string("\xEF\xBB\xBFWidth=800\xC2\xA0\r\nName=a\xE2\x80\xA8"
-                                             "b\xE2\x80\xA9"
-                                             "c\r\n"),
-                                 std::string("Pilot=\x93"
-                                             "Ace\x94\xA0\x81\r\n")}) {
-    game.Write("eaw.ini", ini);
-    QTest::mouseClick(driver.Find<QPushButton>("IniEdit"), Qt::LeftButton);
-    QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
-    EXPECT_EQ(game.Read("eaw.ini"), ini + "\r\n");
-  }
-  EXPECT_TRUE(text->toPlainText().startsWith(QString::fromUtf8("Pilot=\u201CAce\u201D")));
-
-  text->moveCursor(QTextCursor::End);
-  text->insertPlainText("Day=3\n");
-  QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
-  EXPECT_EQ(game.Read("eaw.ini"), "Pilot=\x93"
-                                  "Ace\x94\xA0\x81\r\nDay=3\r\n\r\n");
 }

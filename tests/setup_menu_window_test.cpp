@@ -20,7 +20,7 @@ QMenu *OpenMenu(WindowDriver &driver, int row) {
   QTableView *grid = driver.Grid();
   qDeleteAll(driver.Window().findChildren<QMenu *>("FolderGridMenu"));
   if (row > 0) {
-    const QPoint at = grid->visualRect(grid->model()->index(row - 1, 1)).center();
+    const QPoint at = grid->visualRect(driver.Cell(row)).center();
     QTest::mouseClick(grid->viewport(), Qt::RightButton, {}, at);
     QContextMenuEvent click(QContextMenuEvent::Mouse, at, grid->viewport()->mapToGlobal(at));
     QApplication::sendEvent(grid->viewport(), &click);
@@ -80,7 +80,7 @@ TEST(SetupMenuWindow, SavesSwitchesDeletesAndCopiesSetups) {
   EXPECT_EQ(QGuiApplication::clipboard()->text(), "N-y\nN-x\n");
 
   Choose(OpenMenu(driver, 0), {"Save loaded folders as a setup…"});
-  auto *ask = driver.Window().findChild<QInputDialog *>("SetupNameDialog");
+  auto *ask = driver.Find<QInputDialog>("SetupNameDialog");
   ASSERT_NE(ask, nullptr);
   ask->setTextValue(" Two sounds ");
   ask->accept();
@@ -95,7 +95,7 @@ TEST(SetupMenuWindow, SavesSwitchesDeletesAndCopiesSetups) {
   EXPECT_EQ(driver.Mark(3) + driver.Mark(1), "S");
 
   Choose(OpenMenu(driver, 1), {"Delete setup", "Two sounds"});
-  auto *sure = driver.Window().findChild<QMessageBox *>("ConfirmDeleteSetup");
+  auto *sure = driver.Find<QMessageBox>("ConfirmDeleteSetup");
   ASSERT_NE(sure, nullptr);
   sure->button(QMessageBox::Yes)->click();
   EXPECT_FALSE(game.Exists("ZEP128/#Selector/setups/Two sounds.txt"));
@@ -115,31 +115,24 @@ TEST(SetupMenuWindow, FilesDialogSortsAndTheNoticeNamesReplacedFiles) {
   WindowDriver driver(game.Path());
   driver.ClickRow(1);
   driver.ClickRow(2);
-  QApplication::processEvents();
-  const QList<QMessageBox *> boxes = driver.Window().findChildren<QMessageBox *>();
-  ASSERT_EQ(boxes.size(), 1);
-  EXPECT_TRUE(boxes[0]->text().startsWith("\"N-b\" replaced files of \"N-a\""));
-  EXPECT_TRUE(boxes[0]->text().endsWith("... and 3 more."));
-  driver.TakeMessages();
+  EXPECT_TRUE(driver.OneMessage({"\"N-b\" replaced files of \"N-a\"", "\n... and 3 more."}));
 
   Choose(OpenMenu(driver, 1), {"Files of this folder…"});
-  auto *table = driver.Window().findChild<QTableView *>("FolderFilesTable");
+  auto *table = driver.Find<QTableView>("FolderFilesTable");
   ASSERT_NE(table, nullptr);
-  QAbstractItemModelTester tester(table->model(),
-                                  QAbstractItemModelTester::FailureReportingMode::Fatal);
-  ASSERT_EQ(table->model()->rowCount(), 16);
-  EXPECT_EQ(table->model()->index(0, 0).data().toString(), "f10.dat");
-  EXPECT_EQ(table->model()->index(0, 2).data().toString(), "replaced by \"N-b\", loaded later");
-  EXPECT_EQ(table->model()->index(0, 3).data().toString(), "N-b");
+  QAbstractItemModel *files = table->model();
+  QAbstractItemModelTester tester(files, QAbstractItemModelTester::FailureReportingMode::Fatal);
+  ASSERT_EQ(files->rowCount(), 16);
+  EXPECT_EQ(files->index(0, 0).data().toString(), "f10.dat");
+  EXPECT_EQ(files->index(0, 2).data().toString(), "replaced by \"N-b\", loaded later");
+  EXPECT_EQ(files->index(0, 3).data().toString(), "N-b");
   QHeaderView *header = table->horizontalHeader();
   for (const char *first : {"z.dat", "f10.dat"}) {
     QTest::mouseClick(header->viewport(), Qt::LeftButton, {},
                       QPoint(header->sectionViewportPosition(2) + 5, 5));
-    EXPECT_EQ(table->model()->index(0, 0).data().toString(), first);
+    EXPECT_EQ(files->index(0, 0).data().toString(), first);
   }
-  EXPECT_TRUE(driver.Window()
-                  .findChild<QLabel *>("FolderFilesHeading")
-                  ->text()
-                  .contains("1 other folder of the library has files of the same names: \"N-b\" "
-                            "(15)."));
+  EXPECT_TRUE(
+      driver.Text("FolderFilesHeading")
+          .contains("1 other folder of the library has files of the same names: \"N-b\" (15)."));
 }

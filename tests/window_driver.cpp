@@ -6,7 +6,9 @@
 
 #include <QApplication>
 #include <QLabel>
+#include <QListWidget>
 #include <QMessageBox>
+#include <QPlainTextEdit>
 #include <QTest>
 
 WindowDriver::WindowDriver(const std::filesystem::path &eawDir)
@@ -21,12 +23,40 @@ WindowDriver::WindowDriver(const std::filesystem::path &eawDir)
 
 void WindowDriver::ClickRow(int row, int column) {
   QTableView *grid = Grid();
-  const QModelIndex index = grid->model()->index(row - 1, column);
-  grid->scrollTo(index);
-  QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, grid->visualRect(index).center());
+  grid->scrollTo(Cell(row, column));
+  QTest::mouseClick(grid->viewport(), Qt::LeftButton, {},
+                    grid->visualRect(Cell(row, column)).center());
 }
 
-QString WindowDriver::Mark(int row) { return Grid()->model()->index(row - 1, 2).data().toString(); }
+void WindowDriver::HoverRow(int row) {
+  QTest::mouseMove(Grid()->viewport(), Grid()->visualRect(Cell(row)).center());
+}
+
+void WindowDriver::Click(const char *name) {
+  QTest::mouseClick(Find<QWidget>(name), Qt::LeftButton);
+}
+
+void WindowDriver::ClickEntry(const char *list, int entry) {
+  auto *widget = Find<QListWidget>(list);
+  QTest::mouseClick(widget->viewport(), Qt::LeftButton, {},
+                    widget->visualItemRect(widget->item(entry)).center());
+}
+
+void WindowDriver::Press(const char *box, const QString &text) {
+  auto *edit = Find<QLineEdit>(box);
+  edit->setFocus();
+  edit->setText(text);
+  QTest::keyClick(edit, Qt::Key_Return);
+}
+
+QString WindowDriver::Text(const char *name) {
+  auto *widget = Find<QWidget>(name);
+  if (auto *editor = qobject_cast<QPlainTextEdit *>(widget))
+    return editor->toPlainText();
+  return widget->property("text").toString();
+}
+
+QString WindowDriver::Mark(int row) { return Cell(row, 2).data().toString(); }
 
 QString WindowDriver::Summary() { return Find<QLabel>("Label22")->text(); }
 
@@ -52,6 +82,16 @@ QStringList WindowDriver::TakeMessages() {
   }
   QApplication::processEvents();
   return texts;
+}
+
+testing::AssertionResult WindowDriver::OneMessage(std::initializer_list<QString> parts) {
+  const QStringList texts = TakeMessages();
+  bool holds = texts.size() == 1;
+  for (const QString &part : parts)
+    holds = holds && texts[0].contains(part);
+  if (holds)
+    return testing::AssertionSuccess();
+  return testing::AssertionFailure() << "messages: " << texts.join(" | ").toStdString();
 }
 
 void MakeStandInGame(GameFolder &game, int status) {
