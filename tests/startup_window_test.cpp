@@ -18,7 +18,7 @@
 
 namespace fs = std::filesystem;
 
-TEST(StartupWindow, FirstStartCreatesTheLibraryShowsTheControlsAndPagesAndMinimisesAndExits) {
+TEST(StartupWindow, FirstStartCreatesTheLibraryShowsTheControlsMinimisesAndExits) {
   GameFolder game;
   WindowDriver driver(game.Path());
   EXPECT_EQ(game.Read("ZEP128/zep.ini"), DefaultCategoryText());
