@@ -60,15 +60,20 @@ QStringList Entries(QMenu *menu) {
 
 } // namespace
 
-TEST(SetupMenuWindow, SavesSwitchesDeletesAndCopiesSetups) {
+TEST(SetupMenuWindow, SavesSwitchesDeletesAndCopiesSetupsAndShowsAFoldersFiles) {
   GameFolder game;
   game.WithGameFolders().WithCategories("Skins: S\r\nSounds: N\r\n");
   game.Addon("S-a", {"a.dat"});
   game.Addon("N-x", {"x.wav"});
   game.Addon("N-y", {"y.wav"});
+  game.Addon("N-a", {"z.dat"});
+  for (int i = 10; i < 25; ++i) {
+    game.Write("ZEP128/N-a/f" + std::to_string(i) + ".dat");
+    game.Write("ZEP128/N-b/f" + std::to_string(i) + ".dat");
+  }
   WindowDriver driver(game.Path());
-  driver.ClickRow(3);
-  driver.ClickRow(2);
+  driver.ClickRow(5);
+  driver.ClickRow(4);
 
   QMenu *menu = OpenMenu(driver, 1);
   ASSERT_NE(menu, nullptr);
@@ -87,12 +92,12 @@ TEST(SetupMenuWindow, SavesSwitchesDeletesAndCopiesSetups) {
   EXPECT_EQ(game.Read("ZEP128/#Selector/setups/Two sounds.txt"), "N-y\r\nN-x\r\n");
   EXPECT_EQ(driver.Summary(), "Saved 2 loaded folders as \"Two sounds\".");
 
-  driver.ClickRow(3);
+  driver.ClickRow(5);
   driver.ClickRow(1);
   Choose(OpenMenu(driver, 1), {"Switch to setup", "Two sounds"});
   EXPECT_TRUE(
       driver.Summary().startsWith("Switched to \"Two sounds\": 2 folders unloaded, 2 loaded"));
-  EXPECT_EQ(driver.Mark(3) + driver.Mark(1), "S");
+  EXPECT_EQ(driver.Mark(5) + driver.Mark(1), "S");
 
   Choose(OpenMenu(driver, 1), {"Delete setup", "Two sounds"});
   auto *sure = driver.Find<QMessageBox>("ConfirmDeleteSetup");
@@ -102,22 +107,12 @@ TEST(SetupMenuWindow, SavesSwitchesDeletesAndCopiesSetups) {
   EXPECT_TRUE(driver.Summary().startsWith("Switched to")); // a deletion keeps the line
 
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
-}
 
-TEST(SetupMenuWindow, FilesDialogSortsAndTheNoticeNamesReplacedFiles) {
-  GameFolder game;
-  game.WithGameFolders().WithCategories("Sounds: N\r\n");
-  game.Addon("N-a", {"z.dat"});
-  for (int i = 10; i < 25; ++i) {
-    game.Write("ZEP128/N-a/f" + std::to_string(i) + ".dat");
-    game.Write("ZEP128/N-b/f" + std::to_string(i) + ".dat");
-  }
-  WindowDriver driver(game.Path());
-  driver.ClickRow(1);
   driver.ClickRow(2);
+  driver.ClickRow(3);
   EXPECT_TRUE(driver.OneMessage({"\"N-b\" replaced files of \"N-a\"", "\n... and 3 more."}));
 
-  Choose(OpenMenu(driver, 1), {"Files of this folder…"});
+  Choose(OpenMenu(driver, 2), {"Files of this folder…"});
   auto *table = driver.Find<QTableView>("FolderFilesTable");
   ASSERT_NE(table, nullptr);
   QAbstractItemModel *files = table->model();
