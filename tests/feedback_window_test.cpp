@@ -5,6 +5,7 @@
 #include <QApplication>
 #include <QKeyEvent>
 #include <QMouseEvent>
+#include <QPlainTextEdit>
 #include <QTest>
 #include <gtest/gtest.h>
 
@@ -115,7 +116,7 @@ TEST(FeedbackWindow, ABigLoadShowsItsProgressAndDropsInputQueuedMeanwhile) {
   EXPECT_EQ(driver.Window().windowTitle(), caption);
   EXPECT_EQ(driver.Mark(1), "S");
   EXPECT_EQ(driver.Grid()->model()->rowCount(), 2);
-  EXPECT_FALSE(driver.Text("Text9").contains("second"));
+  EXPECT_FALSE(driver.Find<QPlainTextEdit>("Text9")->toPlainText().contains("second"));
 }
 
 TEST(FeedbackWindow, AStartThatFinishedAnInterruptedUnloadShowsTheInstructions) {

@@ -40,7 +40,7 @@ TEST(GridClickWindow, AClickLoadsAGreenRowAClickOnItUnloadsItAFlightModelShowsIt
   EXPECT_TRUE(panel->isVisible());
   ASSERT_EQ(slotGrid->rowCount(), 1);
   EXPECT_EQ(slotGrid->item(0, 3)->toolTip(), "Lightning");
-  EXPECT_EQ(driver.Text("SlotLabel"), "F-Fast: plane.zep");
+  EXPECT_EQ(driver.Find<QLabel>("SlotLabel")->text(), "F-Fast: plane.zep");
   // The panel covers the description box: it gives way while the pointer is over a row.
   driver.HoverRow(3);
   EXPECT_FALSE(panel->isVisible());

@@ -32,7 +32,7 @@ TEST(ViewsWindow, CategoriesAndTheirRuleShowAfterARefreshTooTypingFindsAShownRow
   EXPECT_EQ(Header(driver), "All folders are available");
 
   driver.ClickEntry("List3", 2);
-  EXPECT_EQ(driver.Text("Label6"), "S");
+  EXPECT_EQ(driver.Find<QLabel>("Label6")->text(), "S");
   EXPECT_EQ(ShownFolders(driver), (QStringList{"S b", "S-a"}));
   EXPECT_EQ(Header(driver), "Only one selection can be made!");
   driver.ClickEntry("List3", 3);
@@ -49,7 +49,7 @@ TEST(ViewsWindow, CategoriesAndTheirRuleShowAfterARefreshTooTypingFindsAShownRow
   game.MakeFolder("ZEP128/S-gamma");
   driver.Click("Label33");
   // A refresh shows the library as it is now, and keeps the category shown (refresh_test.cpp).
-  EXPECT_EQ(driver.Text("Label6"), "S");
+  EXPECT_EQ(driver.Find<QLabel>("Label6")->text(), "S");
   EXPECT_EQ(driver.Summary(), "Refresh: 6 folders, 1 new, 0 gone");
   EXPECT_EQ(ShownFolders(driver), (QStringList{"S b", "S-a", "S-gamma"}));
 
@@ -102,7 +102,7 @@ TEST(ViewsWindow, HoverShowsThePreviewOfTheRowEnteredAndLeavingClearsIt) {
   auto *image = driver.Find<QLabel>("MyImage");
 
   driver.HoverRow(1);
-  EXPECT_EQ(driver.Text("MyLabel"), "Line one\r\nLine two\r\nLine three\r\n");
+  EXPECT_EQ(driver.Find<QLabel>("MyLabel")->text(), "Line one\r\nLine two\r\nLine three\r\n");
   EXPECT_EQ(text->toPlainText(), "Line one\nLine two\nLine three\n");
   EXPECT_FALSE(image->pixmap().isNull());
 

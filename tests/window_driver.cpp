@@ -8,8 +8,6 @@
 #include <QLabel>
 #include <QListWidget>
 #include <QMessageBox>
-#include <QPlainTextEdit>
-#include <QTest>
 
 WindowDriver::WindowDriver(const std::filesystem::path &eawDir)
     : window_(std::make_unique<MainWindow>(eawDir)),
@@ -32,28 +30,10 @@ void WindowDriver::HoverRow(int row) {
   QTest::mouseMove(Grid()->viewport(), Grid()->visualRect(Cell(row)).center());
 }
 
-void WindowDriver::Click(const char *name) {
-  QTest::mouseClick(Find<QWidget>(name), Qt::LeftButton);
-}
-
 void WindowDriver::ClickEntry(const char *list, int entry) {
   auto *widget = Find<QListWidget>(list);
   QTest::mouseClick(widget->viewport(), Qt::LeftButton, {},
                     widget->visualItemRect(widget->item(entry)).center());
-}
-
-void WindowDriver::Press(const char *box, const QString &text) {
-  auto *edit = Find<QLineEdit>(box);
-  edit->setFocus();
-  edit->setText(text);
-  QTest::keyClick(edit, Qt::Key_Return);
-}
-
-QString WindowDriver::Text(const char *name) {
-  auto *widget = Find<QWidget>(name);
-  if (auto *editor = qobject_cast<QPlainTextEdit *>(widget))
-    return editor->toPlainText();
-  return widget->property("text").toString();
 }
 
 QString WindowDriver::Mark(int row) { return Cell(row, 2).data().toString(); }
