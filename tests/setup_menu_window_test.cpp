@@ -51,13 +51,6 @@ void Choose(QMenu *menu, const QStringList &path) {
   QApplication::processEvents();
 }
 
-QStringList Entries(QMenu *menu) {
-  QStringList texts;
-  for (QAction *action : menu->actions())
-    texts << action->text() + (action->isEnabled() ? "" : " (off)");
-  return texts;
-}
-
 } // namespace
 
 TEST(SetupMenuWindow, SavesSwitchesDeletesAndCopiesSetupsAndShowsAFoldersFiles) {
@@ -78,9 +71,12 @@ TEST(SetupMenuWindow, SavesSwitchesDeletesAndCopiesSetupsAndShowsAFoldersFiles) 
   QMenu *menu = OpenMenu(driver, 1);
   ASSERT_NE(menu, nullptr);
   EXPECT_FALSE(game.Exists("a.dat")); // a right-click loads nothing
-  EXPECT_EQ(Entries(menu), (QStringList{"Files of this folder…", "",
-                                        "Save loaded folders as a setup…", "Switch to setup (off)",
-                                        "Delete setup (off)", "", "Copy list of loaded folders"}));
+  QStringList entries;
+  for (QAction *action : menu->actions())
+    entries << action->text() + (action->isEnabled() ? "" : " (off)");
+  EXPECT_EQ(entries, (QStringList{"Files of this folder…", "", "Save loaded folders as a setup…",
+                                  "Switch to setup (off)", "Delete setup (off)", "",
+                                  "Copy list of loaded folders"}));
   Choose(menu, {"Copy list of loaded folders"});
   EXPECT_EQ(QGuiApplication::clipboard()->text(), "N-y\nN-x\n");
 

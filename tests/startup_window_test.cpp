@@ -26,7 +26,6 @@ TEST(StartupWindow, FirstStartCreatesTheLibraryShowsTheControlsMinimisesAndExits
   EXPECT_EQ(driver.Grid()->model()->rowCount(), 0);
   auto *list = driver.Find<QListWidget>("List3");
   ASSERT_EQ(list->count(), 29);
-  EXPECT_EQ(list->item(0)->text(), "Show ALL");
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 
   MainWindow &window = driver.Window();
@@ -72,23 +71,19 @@ TEST(StartupWindow, ASecondInstanceIsRefusedAndTouchesNoFileAKilledOneLeavesNoLo
                {"--hold-instance-lock", FromPath(game.Path())});
   ASSERT_TRUE(holder.waitForReadyRead(60000));
   ASSERT_EQ(holder.readAll().trimmed(), "held");
-  QString title, text;
-  QMessageBox::Icon icon = QMessageBox::NoIcon;
-  int buttons = 0;
+  bool asked = false;
   QTimer::singleShot(0, [&] {
     auto *box = qobject_cast<QMessageBox *>(QApplication::activeModalWidget());
     ASSERT_NE(box, nullptr);
-    title = box->windowTitle();
-    text = box->text();
-    icon = box->icon();
-    buttons = static_cast<int>(box->buttons().size());
+    asked = true;
+    EXPECT_EQ(box->windowTitle(), "Hang On...........");
+    EXPECT_EQ(box->text(), DuplicateInstanceText());
+    EXPECT_EQ(box->icon(), QMessageBox::Warning);
+    EXPECT_EQ(box->buttons().size(), 1);
     box->button(QMessageBox::Ok)->click();
   });
   EXPECT_EQ(RunSelector(game.Path()), 0);
-  EXPECT_EQ(title, "Hang On...........");
-  EXPECT_EQ(text, DuplicateInstanceText());
-  EXPECT_EQ(icon, QMessageBox::Warning);
-  EXPECT_EQ(buttons, 1);
+  EXPECT_TRUE(asked);
   EXPECT_TRUE(fs::is_empty(game.Path()));
   holder.kill();
   ASSERT_TRUE(holder.waitForFinished(60000));
