@@ -80,22 +80,19 @@ TEST(SettingsWindow, EditorShowsFollowsTheBoxesAsksBeforeSavingOverAChangeKeepsB
 
   // An unchanged text is saved byte for byte: a byte-order mark, no-break spaces and Unicode line
   // and paragraph separators in UTF-8, then curly quotes and a no-break space in Windows-1252.
-  for (const std::string &ini : {std::string("\xEF\xBB\xBFWidth=800\xC2\xA0\r\nName=a\xE2\x80\xA8"
-                                             "b\xE2\x80\xA9"
-                                             "c\r\n"),
-                                 std::string("Pilot=\x93"
-                                             "Ace\x94\xA0\x81\r\n")}) {
+  for (const std::string &ini :
+       {std::string("\xEF\xBB\xBFWidth=800\xC2\xA0\r\nName=a\xE2\x80\xA8-\xE2\x80\xA9-\r\n"),
+        std::string("Pilot=\x93Top\x94\xA0\x81\r\n")}) {
     game.Write("eaw.ini", ini);
     driver.Click("IniEdit");
     driver.Click("InSaver");
     EXPECT_EQ(game.Read("eaw.ini"), ini + "\r\n");
   }
-  EXPECT_TRUE(text->toPlainText().startsWith(QString::fromUtf8("Pilot=\u201CAce\u201D")));
+  EXPECT_TRUE(text->toPlainText().startsWith(QString::fromUtf8("Pilot=\u201CTop\u201D")));
   text->moveCursor(QTextCursor::End);
   text->insertPlainText("Day=3\n");
   driver.Click("InSaver");
-  EXPECT_EQ(game.Read("eaw.ini"), "Pilot=\x93"
-                                  "Ace\x94\xA0\x81\r\nDay=3\r\n\r\n");
+  EXPECT_EQ(game.Read("eaw.ini"), "Pilot=\x93Top\x94\xA0\x81\r\nDay=3\r\n\r\n");
   QTest::mouseClick(editor, Qt::LeftButton, {}, QPoint(editor->width() - 5, editor->height() - 5));
   EXPECT_FALSE(editor->isVisible());
 }

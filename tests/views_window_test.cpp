@@ -23,11 +23,13 @@ QString Header(WindowDriver &driver) {
 
 } // namespace
 
-TEST(ViewsWindow, CategoriesAndTheirRuleShowAfterARefreshTooTypingFindsAShownRowLoadedAreBold) {
+TEST(ViewsWindow, CategoriesRefreshTypingAndResetAllShowInTheGrid) {
   GameFolder game;
   game.WithCategories("Skins: S\r\nLower: s\r\nSounds: N\r\n");
   for (const char *name : {"S-a", "S b", "Sx", "s-c", "N-d"})
     game.MakeFolder(std::string("ZEP128/") + name);
+  for (const char *name : {"readme.txt", "pic1.bmp", "title.bmp"})
+    game.Write(name);
   WindowDriver driver(game.Path());
   EXPECT_EQ(Header(driver), "All folders are available");
 
@@ -46,7 +48,7 @@ TEST(ViewsWindow, CategoriesAndTheirRuleShowAfterARefreshTooTypingFindsAShownRow
   EXPECT_EQ(ShownFolders(driver).size(), 5);
 
   driver.ClickEntry("List3", 2);
-  game.MakeFolder("ZEP128/S-gamma");
+  game.Write("ZEP128/S-gamma/planes.dat");
   driver.Click("Label33");
   // A refresh shows the library as it is now, and keeps the category shown (refresh_test.cpp).
   EXPECT_EQ(driver.Find<QLabel>("Label6")->text(), "S");
@@ -66,26 +68,17 @@ TEST(ViewsWindow, CategoriesAndTheirRuleShowAfterARefreshTooTypingFindsAShownRow
   EXPECT_TRUE(driver.Cell(3).data(Qt::FontRole).value<QFont>().bold());
   EXPECT_FALSE(driver.Cell(2).data(Qt::FontRole).isValid());
   EXPECT_EQ(driver.Cell(3).data(Qt::ToolTipRole).toString(), "S-gamma");
-}
 
-TEST(ViewsWindow, ResetAllAsksWithCancelAsDefaultThenUnmarksEveryRow) {
-  GameFolder game;
-  game.WithCategories("Skins: S\r\n");
-  game.Write("ZEP128/S-one/planes.dat");
-  for (const char *name : {"readme.txt", "pic1.bmp", "title.bmp"})
-    game.Write(name);
-  WindowDriver driver(game.Path());
-  driver.ClickRow(1);
   EXPECT_EQ(driver.AnswerNextBox(QMessageBox::NoButton, [&] { driver.Click("Command1"); }),
             "Reset All will unload every loaded folder: it takes out the 1 file they put into the "
             "game and puts back the game's own files they replaced. The loaded folders are saved "
             "first as the setup \"Before Reset All\": switching to it (right-click the folder "
             "grid) loads them again. It also deletes these 2 files from the game folder:\n"
             "pic1.bmp\nreadme.txt");
-  EXPECT_EQ(driver.Mark(1), "S");
+  EXPECT_EQ(driver.Mark(3), "S");
   driver.AnswerNextBox(QMessageBox::Ok, [&] { driver.Click("Command1"); });
   EXPECT_FALSE(game.Exists("pic1.bmp"));
-  EXPECT_EQ(driver.Mark(1), "");
+  EXPECT_EQ(driver.Mark(3), "");
 }
 
 TEST(ViewsWindow, HoverShowsThePreviewOfTheRowEnteredAndLeavingClearsIt) {
