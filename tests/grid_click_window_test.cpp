@@ -20,12 +20,10 @@ TEST(GridClickWindow, AClickLoadsAGreenRowAClickOnItUnloadsItAFlightModelShowsIt
   game.Write("ZEP128/F-Fast/P-Lightning/plane.zep", zep);
   game.Write("ZEP128/F-Plain/flight.dat");
   WindowDriver driver(game.Path());
-  const QString caption = driver.Window().windowTitle();
 
   driver.ClickRow(1, 2);
   EXPECT_EQ(driver.Cell(1).data(Qt::BackgroundRole).value<QColor>(), QColor(192, 255, 192));
   EXPECT_EQ(driver.Mark(1), "S");
-  EXPECT_EQ(driver.Window().windowTitle(), caption);
   EXPECT_EQ(driver.Summary(), "Loaded \"Q-Mix\": 2 files copied.");
   EXPECT_TRUE(driver.OneMessage({"held.dat"}));
 

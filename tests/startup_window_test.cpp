@@ -24,8 +24,7 @@ TEST(StartupWindow, FirstStartCreatesTheLibraryShowsTheControlsMinimisesAndExits
   EXPECT_EQ(game.Read("ZEP128/zep.ini"), DefaultCategoryText());
   EXPECT_EQ(fs::file_size(game.Path() / "ZEP128/FoldersLoaded.txt"), 0u);
   EXPECT_EQ(driver.Grid()->model()->rowCount(), 0);
-  auto *list = driver.Find<QListWidget>("List3");
-  ASSERT_EQ(list->count(), 29);
+  EXPECT_EQ(driver.Find<QListWidget>("List3")->count(), 29);
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 
   MainWindow &window = driver.Window();
