@@ -50,7 +50,7 @@ TEST(ViewsWindow, CategoriesRefreshTypingAndResetAllShowInTheGrid) {
   driver.ClickEntry("List3", 2);
   game.Write("ZEP128/S-gamma/planes.dat");
   driver.Click("Label33");
-  // A refresh shows the library as it is now, and keeps the category shown (refresh_test.cpp).
+  // A refresh shows the library as it is now, and keeps the category shown (grid_views_test.cpp).
   EXPECT_EQ(driver.Find<QLabel>("Label6")->text(), "S");
   EXPECT_EQ(driver.Summary(), "Refresh: 6 folders, 1 new, 0 gone");
   EXPECT_EQ(ShownFolders(driver), (QStringList{"S b", "S-a", "S-gamma"}));
