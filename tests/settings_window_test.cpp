@@ -40,25 +40,22 @@ TEST(SettingsWindow, BoxesShowTheFileAndEnterSavesThemOrSaysWhyNot) {
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
   EXPECT_EQ(driver.Summary(), "3 settings saved to eaw.ini");
 
-  // A temporary name taken by a folder makes the write fail: the file stays as it was.
+  // A temporary name taken by a folder makes the write fail.
   game.Write("eaw.ini.partial/in-the-way");
   PressEnterIn(driver, "Text5", "640");
-  EXPECT_EQ(game.Read("eaw.ini"), "Width=800\r\nMonth=0\r\nDay=\r\n");
-  const QStringList messages = driver.TakeMessages();
-  ASSERT_EQ(messages.size(), 1);
-  EXPECT_TRUE(messages[0].contains("eaw.ini"));
+  EXPECT_TRUE(driver.OneMessage({"The settings could not be saved:", "eaw.ini"}));
   EXPECT_EQ(driver.Summary(), kInstructions); // the line of the save before is gone
-  QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
-  EXPECT_TRUE(driver.TakeMessages().join("|").startsWith("The settings file could not be saved:"));
+  driver.Click("InSaver");
+  EXPECT_TRUE(driver.OneMessage({"The settings file could not be saved:"}));
 }
 
-TEST(SettingsWindow, EditorShowsFollowsTheBoxesAsksBeforeSavingOverAChangeAndHides) {
+TEST(SettingsWindow, EditorShowsFollowsTheBoxesAsksBeforeSavingOverAChangeKeepsBytesAndHides) {
   GameFolder game;
   game.Write("eaw.ini", "Width=800\r\nHeight=600\r\n");
   WindowDriver driver(game.Path());
   auto *editor = driver.Find<QWidget>("Frame21");
   driver.Find<QTabWidget>("SSTab1")->setCurrentIndex(0);
-  QTest::mouseClick(driver.Find<QPushButton>("IniEdit"), Qt::LeftButton);
+  driver.Click("IniEdit");
   EXPECT_TRUE(editor->isVisible());
   auto *text = driver.Find<QPlainTextEdit>("Text14");
   EXPECT_EQ(text->toPlainText(), "Width=800\nHeight=600\n");
@@ -72,16 +69,30 @@ TEST(SettingsWindow, EditorShowsFollowsTheBoxesAsksBeforeSavingOverAChangeAndHid
   text->setPlainText("Width=1280\nHeight=600\nExtra=1\n");
   PressEnterIn(driver, "Text6", "768");
   EXPECT_EQ(text->toPlainText(), "Width=1280\nHeight=600\nExtra=1\n");
-  auto *save = driver.Find<QPushButton>("InSaver");
-  EXPECT_EQ(
-      driver.AnswerNextBox(QMessageBox::Cancel, [&] { QTest::mouseClick(save, Qt::LeftButton); }),
-      "eaw.ini has changed since the editor showed it (Height). Save the editor's text over "
-      "it?");
+  EXPECT_EQ(driver.AnswerNextBox(QMessageBox::Cancel, [&] { driver.Click("InSaver"); }),
+            "eaw.ini has changed since the editor showed it (Height). Save the editor's text over "
+            "it?");
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1024\r\nHeight=768\r\n");
-  driver.AnswerNextBox(QMessageBox::Ok, [&] { QTest::mouseClick(save, Qt::LeftButton); });
+  driver.AnswerNextBox(QMessageBox::Ok, [&] { driver.Click("InSaver"); });
   EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\nHeight=600\r\nExtra=1\r\n\r\n");
   EXPECT_EQ(driver.Find<QLineEdit>("Text5")->text(), "1280");
   EXPECT_EQ(driver.Summary(), "eaw.ini saved");
+
+  // An unchanged text is saved byte for byte: a byte-order mark, no-break spaces and Unicode line
+  // and paragraph separators in UTF-8, then curly quotes and a no-break space in Windows-1252.
+  for (const std::string &ini :
+       {std::string("\xEF\xBB\xBFWidth=800\xC2\xA0\r\nName=a\xE2\x80\xA8-\xE2\x80\xA9-\r\n"),
+        std::string("Pilot=\x93Top\x94\xA0\x81\r\n")}) {
+    game.Write("eaw.ini", ini);
+    driver.Click("IniEdit");
+    driver.Click("InSaver");
+    EXPECT_EQ(game.Read("eaw.ini"), ini + "\r\n");
+  }
+  EXPECT_TRUE(text->toPlainText().startsWith(QString::fromUtf8("Pilot=\u201CTop\u201D")));
+  text->moveCursor(QTextCursor::End);
+  text->insertPlainText("Day=3\n");
+  driver.Click("InSaver");
+  EXPECT_EQ(game.Read("eaw.ini"), "Pilot=\x93Top\x94\xA0\x81\r\nDay=3\r\n\r\n");
   QTest::mouseClick(editor, Qt::LeftButton, {}, QPoint(editor->width() - 5, editor->height() - 5));
   EXPECT_FALSE(editor->isVisible());
 }
@@ -99,21 +110,15 @@ TEST(SettingsWindow, MusicListSwitchesThereAndBack) {
   EXPECT_EQ(list->item(0)->text(), "Swing");
   EXPECT_EQ(current->text(), "Rock");
 
-  QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
-                    list->visualItemRect(list->item(0)).center());
-  EXPECT_TRUE(game.Exists("Music/swing.bgm"));
+  driver.ClickEntry("List4", 0);
   EXPECT_EQ(current->text(), "Swing");
   // The line ".." is named once, at the start, and not again at each switch.
-  const QStringList messages = driver.TakeMessages();
-  ASSERT_EQ(messages.size(), 1);
-  EXPECT_TRUE(messages[0].contains("line 2 was ignored")) << messages[0].toStdString();
+  EXPECT_TRUE(driver.OneMessage({"line 2 was ignored"}));
   EXPECT_EQ(driver.Summary(), "Music set Swing is playing");
   ASSERT_EQ(list->count(), 2);
   EXPECT_EQ(list->item(1)->text(), "Rock");
 
-  QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
-                    list->visualItemRect(list->item(1)).center());
-  EXPECT_TRUE(game.Exists("Music/rock.bgm"));
+  driver.ClickEntry("List4", 1);
   EXPECT_EQ(current->text(), "Rock");
 }
 
@@ -126,12 +131,9 @@ TEST(SettingsWindow, MusicSetNamesThatAreNotTextKeepTheirBytes) {
   game.Write("Music/rock.bgm");
   game.Write(latin1 + "/klang.bgm");
   WindowDriver driver(game.Path());
-  auto *list = driver.Find<QListWidget>("List4");
   for (int time = 0; time < 2; ++time)
-    QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
-                      list->visualItemRect(list->item(0)).center());
-  EXPECT_TRUE(game.Exists(latin1 + "/klang.bgm"));
-  EXPECT_TRUE(game.Exists("Music/rock.bgm"));
+    driver.ClickEntry("List4", 0);
+  EXPECT_TRUE(game.All({latin1 + "/klang.bgm", "Music/rock.bgm"}));
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 }
 #endif
@@ -139,52 +141,23 @@ TEST(SettingsWindow, MusicSetNamesThatAreNotTextKeepTheirBytes) {
 TEST(SettingsWindow, FlyStartsTheGameEachTimeOrSaysWhyNotAndTellsAQuickFailureOnce) {
   GameFolder game;
   WindowDriver driver(game.Path());
-  auto *fly = driver.Find<QPushButton>("delmsn");
-  QTest::mouseClick(fly, Qt::LeftButton);
+  driver.Click("delmsn");
   const QStringList messages = driver.TakeMessages();
   ASSERT_EQ(messages.size(), 1);
   EXPECT_TRUE(messages[0].contains(QString::fromStdString((game.Path() / "eaw.exe").string())));
   EXPECT_EQ(messages[0].count("started"), 1); // said once
 
   MakeStandInGame(game);
-  QTest::mouseClick(fly, Qt::LeftButton);
-  QTest::mouseClick(fly, Qt::LeftButton);
+  driver.Click("delmsn");
+  driver.Click("delmsn");
   EXPECT_TRUE(QTest::qWaitFor([&] { return StartedCount(game.Path()) == 2; }, 5000));
   EXPECT_EQ(driver.Summary(), "Game started");
   EXPECT_TRUE(driver.Window().isVisible());
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 
   MakeStandInGame(game, 3);
-  QTest::mouseClick(fly, Qt::LeftButton);
-  QStringList failed;
-  EXPECT_TRUE(QTest::qWaitFor([&] { return !(failed = driver.TakeMessages()).isEmpty(); }));
-  ASSERT_EQ(failed.size(), 1);
-  EXPECT_TRUE(failed[0].contains("status 3")) << failed[0].toStdString();
+  driver.Click("delmsn");
+  EXPECT_TRUE(QTest::qWaitFor([&] { return driver.OneMessage({"status 3"}); }));
   QTest::qWait(300);
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
-}
-
-TEST(SettingsWindow, EditorSavesUnchangedTextByteForByte) {
-  GameFolder game;
-  WindowDriver driver(game.Path());
-  auto *text = driver.Find<QPlainTextEdit>("Text14");
-  // A byte-order mark, no-break spaces and Unicode line and paragraph separators in UTF-8, then
-  // curly quotes and a no-break space in Windows-1252.
-  for (const std::string &ini : {std::string("\xEF\xBB\xBFWidth=800\xC2\xA0\r\nName=a\xE2\x80\xA8"
-                                             "b\xE2\x80\xA9"
-                                             "c\r\n"),
-                                 std::string("Pilot=\x93"
-                                             "Ace\x94\xA0\x81\r\n")}) {
-    game.Write("eaw.ini", ini);
-    QTest::mouseClick(driver.Find<QPushButton>("IniEdit"), Qt::LeftButton);
-    QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
-    EXPECT_EQ(game.Read("eaw.ini"), ini + "\r\n");
-  }
-  EXPECT_TRUE(text->toPlainText().startsWith(QString::fromUtf8("Pilot=\u201CAce\u201D")));
-
-  text->moveCursor(QTextCursor::End);
-  text->insertPlainText("Day=3\n");
-  QTest::mouseClick(driver.Find<QPushButton>("InSaver"), Qt::LeftButton);
-  EXPECT_EQ(game.Read("eaw.ini"), "Pilot=\x93"
-                                  "Ace\x94\xA0\x81\r\nDay=3\r\n\r\n");
 }

@@ -18,28 +18,18 @@
 
 namespace fs = std::filesystem;
 
-TEST(StartupWindow, FirstStartCreatesTheLibraryAndShowsTheWindowsCaptionControlsAndPages) {
+TEST(StartupWindow, FirstStartCreatesTheLibraryShowsTheControlsMinimisesAndExits) {
   GameFolder game;
   WindowDriver driver(game.Path());
   EXPECT_EQ(game.Read("ZEP128/zep.ini"), DefaultCategoryText());
   EXPECT_EQ(fs::file_size(game.Path() / "ZEP128/FoldersLoaded.txt"), 0u);
   EXPECT_EQ(driver.Grid()->model()->rowCount(), 0);
-  EXPECT_EQ(driver.Grid()->model()->headerData(1, Qt::Horizontal), "All folders are available");
-  auto *list = driver.Find<QListWidget>("List3");
-  ASSERT_EQ(list->count(), 29);
-  EXPECT_EQ(list->item(0)->text(), "Show ALL");
+  EXPECT_EQ(driver.Find<QListWidget>("List3")->count(), 29);
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
 
   MainWindow &window = driver.Window();
-  EXPECT_EQ(window.windowTitle().size(), 108);
   EXPECT_TRUE(window.windowTitle().startsWith("ZEP for 150 "));
-  EXPECT_TRUE(window.windowTitle().endsWith("Build: 22nd June 2016   #1"));
-  auto *tabs = driver.Find<QTabWidget>("SSTab1");
-  EXPECT_EQ(tabs->tabText(0), "General Settings");
-  EXPECT_EQ(tabs->tabText(1), "World settings");
-  EXPECT_EQ(driver.Summary(),
-            "Click on a white row to load a folder, or click on a green row to unload it. "
-            "Right-click a row for setups and the folder's files.");
+  EXPECT_EQ(driver.Summary(), kInstructions);
   EXPECT_FALSE(driver.Find<QWidget>("Frame21")->isVisible());
   EXPECT_TRUE(driver.Grid()->isColumnHidden(0));
   // One font everywhere, also inside the frames that have style sheets.
@@ -49,6 +39,10 @@ TEST(StartupWindow, FirstStartCreatesTheLibraryAndShowsTheWindowsCaptionControls
     EXPECT_EQ(font.family(), windowFont.family()) << name;
     EXPECT_EQ(font.pointSizeF(), windowFont.pointSizeF()) << name;
   }
+  driver.Click("Command8");
+  EXPECT_TRUE(window.windowState() & Qt::WindowMinimized);
+  driver.Click("Command3");
+  EXPECT_FALSE(window.isVisible());
 }
 
 TEST(StartupWindow, RecordedFoldersShowGreenAfterARestart) {
@@ -58,61 +52,38 @@ TEST(StartupWindow, RecordedFoldersShowGreenAfterARestart) {
   game.Write("ZEP128/N-two/b.dat");
   game.WithRecord("N-two\r\n\r\n");
   WindowDriver driver(game.Path());
-  QAbstractItemModel *model = driver.Grid()->model();
-  ASSERT_EQ(model->rowCount(), 2);
-  EXPECT_EQ(model->index(1, 1).data().toString(), "N-two");
-  EXPECT_EQ(model->index(1, 2).data().toString(), "S");
-  EXPECT_EQ(model->index(1, 1).data(Qt::BackgroundRole).value<QColor>(), QColor(192, 255, 192));
-  EXPECT_FALSE(model->index(0, 1).data(Qt::BackgroundRole).isValid());
+  ASSERT_EQ(driver.Grid()->model()->rowCount(), 2);
+  EXPECT_EQ(driver.Cell(2).data().toString(), "N-two");
+  EXPECT_EQ(driver.Mark(2), "S");
+  EXPECT_EQ(driver.Cell(2).data(Qt::BackgroundRole).value<QColor>(), QColor(192, 255, 192));
+  EXPECT_FALSE(driver.Cell(1).data(Qt::BackgroundRole).isValid());
   EXPECT_FALSE(game.Exists("b.dat"));
   EXPECT_EQ(driver.Grid()->height(),
             53 + driver.Grid()->style()->pixelMetric(QStyle::PM_ScrollBarExtent));
 }
 
-TEST(StartupWindow, ExitAndMinimise) {
-  GameFolder game;
-  WindowDriver driver(game.Path());
-  QTest::mouseClick(driver.Find<QPushButton>("Command8"), Qt::LeftButton);
-  EXPECT_TRUE(driver.Window().windowState() & Qt::WindowMinimized);
-  QTest::mouseClick(driver.Find<QPushButton>("Command3"), Qt::LeftButton);
-  EXPECT_FALSE(driver.Window().isVisible());
-}
-
-TEST(StartupWindow, SecondInstanceIsRefusedAndTouchesNoFile) {
-  GameFolder game;
-  InstanceLock first(game.Path());
-  ASSERT_TRUE(first.Acquired());
-  QString title, text;
-  QMessageBox::Icon icon = QMessageBox::NoIcon;
-  int buttons = 0;
-  QTimer::singleShot(0, [&] {
-    auto *box = qobject_cast<QMessageBox *>(QApplication::activeModalWidget());
-    ASSERT_NE(box, nullptr);
-    title = box->windowTitle();
-    text = box->text();
-    icon = box->icon();
-    buttons = static_cast<int>(box->buttons().size());
-    box->button(QMessageBox::Ok)->click();
-  });
-  EXPECT_EQ(RunSelector(game.Path()), 0);
-  EXPECT_EQ(title, "Hang On...........");
-  EXPECT_EQ(text, DuplicateInstanceText());
-  EXPECT_EQ(text.count("\r\n"), 5);
-  EXPECT_TRUE(text.contains("once.\r\n\r\nYou have"));
-  EXPECT_EQ(icon, QMessageBox::Warning);
-  EXPECT_EQ(buttons, 1);
-  EXPECT_TRUE(fs::is_empty(game.Path()));
-}
-
 // The system releases the lock of an instance that is killed, whatever process ids are reused.
-TEST(StartupWindow, AKilledInstanceLeavesNoLockBehind) {
+TEST(StartupWindow, ASecondInstanceIsRefusedAndTouchesNoFileAKilledOneLeavesNoLock) {
   GameFolder game;
   QProcess holder;
   holder.start(QCoreApplication::applicationFilePath(),
                {"--hold-instance-lock", FromPath(game.Path())});
   ASSERT_TRUE(holder.waitForReadyRead(60000));
   ASSERT_EQ(holder.readAll().trimmed(), "held");
-  EXPECT_FALSE(InstanceLock(game.Path()).Acquired());
+  bool asked = false;
+  QTimer::singleShot(0, [&] {
+    auto *box = qobject_cast<QMessageBox *>(QApplication::activeModalWidget());
+    ASSERT_NE(box, nullptr);
+    asked = true;
+    EXPECT_EQ(box->windowTitle(), "Hang On...........");
+    EXPECT_EQ(box->text(), DuplicateInstanceText());
+    EXPECT_EQ(box->icon(), QMessageBox::Warning);
+    EXPECT_EQ(box->buttons().size(), 1);
+    box->button(QMessageBox::Ok)->click();
+  });
+  EXPECT_EQ(RunSelector(game.Path()), 0);
+  EXPECT_TRUE(asked);
+  EXPECT_TRUE(fs::is_empty(game.Path()));
   holder.kill();
   ASSERT_TRUE(holder.waitForFinished(60000));
   EXPECT_TRUE(InstanceLock(game.Path()).Acquired());
@@ -125,7 +96,6 @@ TEST(StartupWindow, AHugeCategoryFileGivesABoxThatFitsTheScreen) {
     lines += "no colon, line " + std::to_string(line) + "\r\n";
   game.WithCategories("Skins: S\r\n" + lines + std::string(10000, 'x') + "\r\n");
   WindowDriver driver(game.Path());
-  QApplication::processEvents();
   const QList<QMessageBox *> boxes = driver.Window().findChildren<QMessageBox *>();
   ASSERT_EQ(boxes.size(), 1);
   EXPECT_LT(boxes[0]->sizeHint().height(), 700);

@@ -6,15 +6,7 @@
 #include <QTest>
 #include <gtest/gtest.h>
 
-namespace fs = std::filesystem;
-
 namespace {
-
-void ChooseCategory(WindowDriver &driver, int entry) {
-  auto *list = driver.Find<QListWidget>("List3");
-  QTest::mouseClick(list->viewport(), Qt::LeftButton, {},
-                    list->visualItemRect(list->item(entry)).center());
-}
 
 QStringList ShownFolders(WindowDriver &driver) {
   QStringList names;
@@ -29,59 +21,64 @@ QString Header(WindowDriver &driver) {
   return driver.Grid()->model()->headerData(1, Qt::Horizontal).toString();
 }
 
-void HoverRow(WindowDriver &driver, int row) {
-  QTableView *grid = driver.Grid();
-  const QModelIndex index = grid->model()->index(row - 1, 1);
-  QTest::mouseMove(grid->viewport(), grid->visualRect(index).center());
-}
-
 } // namespace
 
-TEST(ViewsWindow, CategoriesShowTheirFoldersAndRule) {
+TEST(ViewsWindow, CategoriesRefreshTypingAndResetAllShowInTheGrid) {
   GameFolder game;
   game.WithCategories("Skins: S\r\nLower: s\r\nSounds: N\r\n");
   for (const char *name : {"S-a", "S b", "Sx", "s-c", "N-d"})
     game.MakeFolder(std::string("ZEP128/") + name);
-  WindowDriver driver(game.Path());
-  EXPECT_EQ(Header(driver), "All folders are available");
-
-  ChooseCategory(driver, 2);
-  EXPECT_EQ(driver.Find<QLabel>("Label6")->text(), "S");
-  EXPECT_EQ(ShownFolders(driver), (QStringList{"S b", "S-a"}));
-  EXPECT_EQ(Header(driver), "Only one selection can be made!");
-  ChooseCategory(driver, 3);
-  EXPECT_EQ(ShownFolders(driver), QStringList{"s-c"});
-  ChooseCategory(driver, 4);
-  EXPECT_EQ(Header(driver), "Multiple selections are allowed!");
-  ChooseCategory(driver, 1);
-  EXPECT_TRUE(ShownFolders(driver).isEmpty());
-  EXPECT_EQ(Header(driver), "All folders are available");
-  ChooseCategory(driver, 0);
-  EXPECT_EQ(ShownFolders(driver).size(), 5);
-}
-
-TEST(ViewsWindow, ResetAllAsksWithCancelAsDefaultThenUnmarksEveryRow) {
-  GameFolder game;
-  game.WithCategories("Skins: S\r\n");
-  game.Write("ZEP128/S-one/planes.dat");
   for (const char *name : {"readme.txt", "pic1.bmp", "title.bmp"})
     game.Write(name);
   WindowDriver driver(game.Path());
-  driver.ClickRow(1);
-  auto *resetAll = driver.Find<QPushButton>("Command1");
-  EXPECT_EQ(driver.AnswerNextBox(QMessageBox::NoButton,
-                                 [&] { QTest::mouseClick(resetAll, Qt::LeftButton); }),
+  EXPECT_EQ(Header(driver), "All folders are available");
+
+  driver.ClickEntry("List3", 2);
+  EXPECT_EQ(driver.Find<QLabel>("Label6")->text(), "S");
+  EXPECT_EQ(ShownFolders(driver), (QStringList{"S b", "S-a"}));
+  EXPECT_EQ(Header(driver), "Only one selection can be made!");
+  driver.ClickEntry("List3", 3);
+  EXPECT_EQ(ShownFolders(driver), QStringList{"s-c"});
+  driver.ClickEntry("List3", 4);
+  EXPECT_EQ(Header(driver), "Multiple selections are allowed!");
+  driver.ClickEntry("List3", 1);
+  EXPECT_TRUE(ShownFolders(driver).isEmpty());
+  EXPECT_EQ(Header(driver), "All folders are available");
+  driver.ClickEntry("List3", 0);
+  EXPECT_EQ(ShownFolders(driver).size(), 5);
+
+  driver.ClickEntry("List3", 2);
+  game.Write("ZEP128/S-gamma/planes.dat");
+  driver.Click("Label33");
+  // A refresh shows the library as it is now, and keeps the category shown (grid_views_test.cpp).
+  EXPECT_EQ(driver.Find<QLabel>("Label6")->text(), "S");
+  EXPECT_EQ(driver.Summary(), "Refresh: 6 folders, 1 new, 0 gone");
+  EXPECT_EQ(ShownFolders(driver), (QStringList{"S b", "S-a", "S-gamma"}));
+
+  QTableView *grid = driver.Grid();
+  grid->setFocus();
+  QTest::keyClicks(grid, "S-g");
+  EXPECT_EQ(grid->currentIndex().data().toString(), "S-gamma");
+  QTest::qWait(QApplication::keyboardInputInterval() + 50);
+  // A first letter typed anew goes on to the next shown row, past hidden ones and round to the top.
+  QTest::keyClicks(grid, "s");
+  EXPECT_EQ(grid->currentIndex().data().toString(), "S b");
+
+  driver.ClickRow(3);
+  EXPECT_TRUE(driver.Cell(3).data(Qt::FontRole).value<QFont>().bold());
+  EXPECT_FALSE(driver.Cell(2).data(Qt::FontRole).isValid());
+  EXPECT_EQ(driver.Cell(3).data(Qt::ToolTipRole).toString(), "S-gamma");
+
+  EXPECT_EQ(driver.AnswerNextBox(QMessageBox::NoButton, [&] { driver.Click("Command1"); }),
             "Reset All will unload every loaded folder: it takes out the 1 file they put into the "
             "game and puts back the game's own files they replaced. The loaded folders are saved "
             "first as the setup \"Before Reset All\": switching to it (right-click the folder "
             "grid) loads them again. It also deletes these 2 files from the game folder:\n"
             "pic1.bmp\nreadme.txt");
-  EXPECT_TRUE(game.Exists("planes.dat"));
-  EXPECT_EQ(driver.Mark(1), "S");
-  driver.AnswerNextBox(QMessageBox::Ok, [&] { QTest::mouseClick(resetAll, Qt::LeftButton); });
+  EXPECT_EQ(driver.Mark(3), "S");
+  driver.AnswerNextBox(QMessageBox::Ok, [&] { driver.Click("Command1"); });
   EXPECT_FALSE(game.Exists("pic1.bmp"));
-  EXPECT_EQ(driver.Mark(1), "");
-  EXPECT_FALSE(driver.Grid()->model()->index(0, 1).data(Qt::BackgroundRole).isValid());
+  EXPECT_EQ(driver.Mark(3), "");
 }
 
 TEST(ViewsWindow, HoverShowsThePreviewOfTheRowEnteredAndLeavingClearsIt) {
@@ -97,52 +94,22 @@ TEST(ViewsWindow, HoverShowsThePreviewOfTheRowEnteredAndLeavingClearsIt) {
   auto *text = driver.Find<QPlainTextEdit>("Text9");
   auto *image = driver.Find<QLabel>("MyImage");
 
-  HoverRow(driver, 1);
+  driver.HoverRow(1);
   EXPECT_EQ(driver.Find<QLabel>("MyLabel")->text(), "Line one\r\nLine two\r\nLine three\r\n");
   EXPECT_EQ(text->toPlainText(), "Line one\nLine two\nLine three\n");
   EXPECT_FALSE(image->pixmap().isNull());
 
-  HoverRow(driver, 2);
+  driver.HoverRow(2);
   EXPECT_EQ(text->toPlainText(), "");
   EXPECT_TRUE(image->pixmap().isNull());
-  HoverRow(driver, 3);
+  driver.HoverRow(3);
   EXPECT_TRUE(text->toPlainText().startsWith("This description is too large to show: 1024 KB"));
   // Leaving the rows clears the preview, and the same row entered again shows it again.
   QTest::mouseMove(driver.Find<QWidget>("LoadFrame"), QPoint(200, 3));
   EXPECT_EQ(text->toPlainText(), "");
-  HoverRow(driver, 3);
+  driver.HoverRow(3);
   EXPECT_FALSE(text->toPlainText().isEmpty());
   EXPECT_TRUE(driver.TakeMessages().isEmpty());
   // The pointer stays where a test leaves it, and a move to the same place is no move.
   QTest::mouseMove(driver.Find<QWidget>("LoadFrame"), QPoint(200, 3));
-}
-
-TEST(ViewsWindow, TheSelectedCategoryShowsAgainTypingFindsAShownRowAndLoadedRowsAreBold) {
-  GameFolder game;
-  game.WithCategories("Skins: S\r\nSounds: N\r\n");
-  for (const char *name : {"S-alpha", "S-beta", "N-bravo"})
-    game.MakeFolder(std::string("ZEP128/") + name);
-  WindowDriver driver(game.Path());
-  ChooseCategory(driver, 3);
-  ChooseCategory(driver, 2);
-  game.MakeFolder("ZEP128/S-gamma");
-  QTest::mouseClick(driver.Find<QLabel>("Label33"), Qt::LeftButton);
-  // A refresh shows the library as it is now, and keeps the category shown (refresh_test.cpp).
-  EXPECT_EQ(driver.Find<QLabel>("Label6")->text(), "S");
-  EXPECT_EQ(driver.Summary(), "Refresh: 4 folders, 1 new, 0 gone");
-  EXPECT_EQ(ShownFolders(driver), (QStringList{"S-alpha", "S-beta", "S-gamma"}));
-
-  QTableView *grid = driver.Grid();
-  grid->setFocus();
-  QTest::keyClicks(grid, "S-b");
-  EXPECT_EQ(grid->currentIndex().data().toString(), "S-beta");
-  QTest::qWait(QApplication::keyboardInputInterval() + 50);
-  QTest::keyClicks(grid, "N");
-  EXPECT_EQ(grid->currentIndex().data().toString(), "S-beta");
-
-  driver.ClickRow(2);
-  const QModelIndex loaded = grid->model()->index(1, 1);
-  EXPECT_TRUE(loaded.data(Qt::FontRole).value<QFont>().bold());
-  EXPECT_FALSE(grid->model()->index(0, 1).data(Qt::FontRole).isValid());
-  EXPECT_EQ(loaded.data(Qt::ToolTipRole).toString(), "S-beta");
 }

@@ -6,8 +6,8 @@
 
 #include <QApplication>
 #include <QLabel>
+#include <QListWidget>
 #include <QMessageBox>
-#include <QTest>
 
 WindowDriver::WindowDriver(const std::filesystem::path &eawDir)
     : window_(std::make_unique<MainWindow>(eawDir)),
@@ -21,12 +21,22 @@ WindowDriver::WindowDriver(const std::filesystem::path &eawDir)
 
 void WindowDriver::ClickRow(int row, int column) {
   QTableView *grid = Grid();
-  const QModelIndex index = grid->model()->index(row - 1, column);
-  grid->scrollTo(index);
-  QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, grid->visualRect(index).center());
+  grid->scrollTo(Cell(row, column));
+  QTest::mouseClick(grid->viewport(), Qt::LeftButton, {},
+                    grid->visualRect(Cell(row, column)).center());
 }
 
-QString WindowDriver::Mark(int row) { return Grid()->model()->index(row - 1, 2).data().toString(); }
+void WindowDriver::HoverRow(int row) {
+  QTest::mouseMove(Grid()->viewport(), Grid()->visualRect(Cell(row)).center());
+}
+
+void WindowDriver::ClickEntry(const char *list, int entry) {
+  auto *widget = Find<QListWidget>(list);
+  QTest::mouseClick(widget->viewport(), Qt::LeftButton, {},
+                    widget->visualItemRect(widget->item(entry)).center());
+}
+
+QString WindowDriver::Mark(int row) { return Cell(row, 2).data().toString(); }
 
 QString WindowDriver::Summary() { return Find<QLabel>("Label22")->text(); }
 
@@ -52,6 +62,16 @@ QStringList WindowDriver::TakeMessages() {
   }
   QApplication::processEvents();
   return texts;
+}
+
+testing::AssertionResult WindowDriver::OneMessage(std::initializer_list<QString> parts) {
+  const QStringList texts = TakeMessages();
+  bool holds = texts.size() == 1;
+  for (const QString &part : parts)
+    holds = holds && texts[0].contains(part);
+  if (holds)
+    return testing::AssertionSuccess();
+  return testing::AssertionFailure() << "messages: " << texts.join(" | ").toStdString();
 }
 
 void MakeStandInGame(GameFolder &game, int status) {
