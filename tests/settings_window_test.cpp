@@ -6,8 +6,6 @@
 #include <QTest>
 #include <gtest/gtest.h>
 
-namespace fs = std::filesystem;
-
 namespace {
 
 void PressEnterIn(WindowDriver &driver, const char *box, const QString &text) {

@@ -16,8 +16,6 @@
 #include <QTimer>
 #include <gtest/gtest.h>
 
-namespace fs = std::filesystem;
-
 TEST(StartupWindow, FirstStartCreatesTheLibraryShowsTheControlsMinimisesAndExits) {
   GameFolder game;
   WindowDriver driver(game.Path());
