@@ -109,11 +109,12 @@ protected:
       for (const auto &[path, bytes] : kFolders.at(folder.name))
         expected[path] = bytes;
     }
+    Files found;
     for (const auto &[folder, files] : kFolders)
-      for (const auto &[path, bytes] : files) {
-        const std::string found = game->Exists(path) ? game->Read(path) : "(none)";
-        EXPECT_EQ(found, expected.count(path) ? expected[path] : "(none)") << path << where;
-      }
+      for (const auto &[path, bytes] : files)
+        if (game->Exists(path))
+          found[path] = game->Read(path);
+    EXPECT_EQ(found, expected) << where;
     const std::vector<std::string> names = ReadLoadedNames(LibraryFor(game->Path()), failures);
     EXPECT_EQ(std::set<std::string>(names.begin(), names.end()), loaded) << where;
     EXPECT_FALSE(game->Exists("ZEP128/#Selector/journal.txt")) << where;

@@ -102,29 +102,27 @@ TEST_F(OuterGame, RandomStateFilesTouchNothingOutsideTheGameFolder) {
   pieces.insert(pieces.end(), {std::string(1, '\0'), std::string(300, 'x')});
   std::mt19937 random(18);
   const auto pick = [&](size_t count) { return random() % count; };
-  // Half the names aim outside whole; the others join one to three pieces of any kind.
-  const auto name = [&] {
+  // A name and its line end: half aim outside whole; the others join one to three pieces.
+  const auto nameLine = [&] {
     std::string text = pick(2) ? pieces[pick(7)] : "";
     for (size_t count = text.empty() ? 1 + pick(3) : 0; count > 0; --count)
       text += pieces[pick(pieces.size())];
-    return text;
+    return text + "\r\n";
   };
   const auto fileLines = [&](size_t count) {
     std::string text;
     for (; count > 0; --count)
-      text += std::string("\t") + "GGSMX"[pick(5)] + "+- "[pick(3)] + name() + "\r\n";
+      text += std::string("\t") + "GGSMX"[pick(5)] + "+- "[pick(3)] + nameLine();
     return text;
   };
-  const char *steps[] = {"load", "loaded", "unload", "reset", "restore"};
+  const std::string steps[] = {"load\r\n", "loaded\r\n", "unload\r\n", "reset\r\n", "restore\r\n"};
   for (int round = 0; round < 40; ++round) {
     if (pick(2) == 0)
       fs::remove_all(game / "Music");
-    WriteState("journal.txt",
-               std::string(steps[pick(5)]) + "\r\n" + name() + "\r\n" + fileLines(pick(6)));
-    WriteState("loaded.txt", "N-One\r\n" + fileLines(pick(4)) + name() + "\r\n" +
-                                 fileLines(pick(4)) + "N-Two\r\n" + fileLines(pick(4)));
-    WriteState("music.txt",
-               (pick(2) ? "Music\r\n" : name() + "\r\n") + name() + "\r\n" + name() + "\r\n");
+    WriteState("journal.txt", steps[pick(5)] + nameLine() + fileLines(pick(6)));
+    WriteState("loaded.txt", "N-One\r\n" + fileLines(pick(4)) + nameLine() + fileLines(pick(4)) +
+                                 "N-Two\r\n" + fileLines(pick(4)));
+    WriteState("music.txt", (pick(2) ? "Music\r\n" : nameLine()) + nameLine() + nameLine());
     StartAndUnloadAll();
     ASSERT_EQ(Snapshot(outer.Path(), "game"), before) << "round " << round;
   }

@@ -60,12 +60,9 @@ TEST_P(FolderLink, IsNamedAndNothingIsWrittenMovedOrChangedThroughIt) {
   Gather(selector->SwitchMusic("Set2", "Set1"));
   EXPECT_EQ(Snapshot(outside.Path()), before);
   EXPECT_TRUE(IsLink(link));
-  EXPECT_TRUE(std::any_of(failures.Lines().begin(), failures.Lines().end(),
-                          [&](const std::string &line) {
-                            return line.find(DisplayPath(link)) != line.npos &&
-                                   line.find("is a link") != line.npos;
-                          }))
-      << failures.Message("");
+  EXPECT_TRUE(std::ranges::any_of(failures.Lines(), [&](const std::string &line) {
+    return Contains(line, DisplayPath(link)) && Contains(line, "is a link");
+  })) << failures.Message("");
 }
 
 INSTANTIATE_TEST_SUITE_P(WhereThingsAreKept, FolderLink,
