@@ -93,6 +93,7 @@ TEST_F(WindowsFiles, ReadOnlyFilesAreReplacedOrDeletedAndHiddenOnesKept) {
   EXPECT_TRUE(game.None({"readme.txt", "plain.dat"}));
   EXPECT_TRUE(game.All({"hidden.dat", "system.dat"}));
 
+  game.WithRecord("old\r\n");
   Give(game.Library() / "FoldersLoaded.txt", kReadOnly);
   SaveLoaded(state, failures);
   EXPECT_EQ(game.Record(), "\r\n");
