@@ -18,13 +18,6 @@ struct CopyPlace {
   CopyWay way;
 };
 
-fs::path SourceBase(const CopyPlace &place, const fs::path &target) {
-  if (!*place.sourceBase)
-    return target;
-  const char *named = std::getenv(place.sourceBase);
-  return named ? fs::path(named) : fs::path(place.sourceBase);
-}
-
 dev_t DeviceOf(const fs::path &path) {
   struct stat info {};
   return ::stat(path.c_str(), &info) == 0 ? info.st_dev : 0;
@@ -47,7 +40,10 @@ class CopyWays : public testing::TestWithParam<CopyPlace> {};
 // library's file as it was.
 TEST_P(CopyWays, TheCopyIsWholeAndIndependentWhicheverWayItTakes) {
   TestFolder target;
-  const fs::path base = SourceBase(GetParam(), target.Path());
+  const char *named = std::getenv(GetParam().sourceBase);
+  const fs::path base = named                    ? named
+                        : *GetParam().sourceBase ? GetParam().sourceBase
+                                                 : target.Path();
   if (!fs::is_directory(base))
     GTEST_SKIP() << "no such folder here: " << base;
   const bool fallback = GetParam().way == CopyWay::Fallback;

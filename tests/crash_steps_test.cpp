@@ -27,56 +27,48 @@ const std::map<std::string, Files> kFolders = {
 const Files kOwn = {
     {"bases.dat", "own bases"}, {"game.cfg", "own cfg"}, {"Savedata/a.msn", "player's mission"}};
 
-// Stops the operation at its n-th committed step by throwing, as a kill there would.
-struct Killed {};
-class StopAtStep {
-public:
-  explicit StopAtStep(int step) {
-    SetStepHook([this, step] {
-      if (++count_ == step)
-        throw Killed{};
-    });
-  }
-  ~StopAtStep() { SetStepHook({}); }
-
-private:
-  int count_ = 0;
-};
-
-// One operation: the folders loaded before it, and what it does.
+// One operation: the folders loaded before it, and the folder it clicks (none: Reset All).
 struct Operation {
   const char *name;
   std::vector<std::string> before;
-  std::function<void(Selector &, Failures &)> run;
+  const char *click;
 };
 
-void PrintTo(const Operation &operation, std::ostream *out) { *out << operation.name; }
-
-std::function<void(Selector &, Failures &)> Clicks(const std::string &folder) {
-  return
-      [folder](Selector &selector, Failures &failures) { ClickFolder(selector, folder, failures); };
-}
+struct Kill {};
 
 class CrashSteps : public ::testing::TestWithParam<Operation> {
 protected:
-#ifndef _WIN32
-  // Hundreds of operations, each flushed to the disk: on a memory file system where there is
-  // one, so that the flushes cost nothing.
   void SetUp() override {
-    if (const char *old = std::getenv("TMPDIR"))
-      oldTemporary = old;
-    std::error_code error;
-    if (fs::is_directory("/dev/shm", error))
+#ifndef _WIN32
+    // Hundreds of operations, each flushed to the disk: on a memory file system where there is
+    // one, so that the flushes cost nothing.
+    oldTemporary = std::getenv("TMPDIR") ? std::getenv("TMPDIR") : "";
+    if (fs::is_directory("/dev/shm"))
       ::setenv("TMPDIR", "/dev/shm", 1);
+#endif
+    // Stops what runs at its chosen committed step by throwing, as a kill there would.
+    SetStepHook([this] {
+      if (--stepsLeft == 0)
+        throw Kill{};
+    });
   }
   void TearDown() override {
-    if (oldTemporary.empty())
-      ::unsetenv("TMPDIR");
-    else
-      ::setenv("TMPDIR", oldTemporary.c_str(), 1);
-  }
-  std::string oldTemporary;
+    SetStepHook({});
+#ifndef _WIN32
+    oldTemporary.empty() ? ::unsetenv("TMPDIR") : ::setenv("TMPDIR", oldTemporary.c_str(), 1);
 #endif
+  }
+  // Whether `run` was killed at its `step`-th committed step.
+  bool KilledAt(int step, const std::function<void()> &run) {
+    stepsLeft = step;
+    try {
+      run();
+    } catch (const Kill &) {
+      return true;
+    }
+    stepsLeft = 0;
+    return false;
+  }
   // A fresh game with the folders `before` loaded; true when the operation was killed at `step`
   // (0 for none) and the recovery then at `recoveryStep`.
   bool KillAt(int step, int recoveryStep) {
@@ -90,21 +82,14 @@ protected:
     Start();
     for (const std::string &folder : GetParam().before)
       ClickFolder(*selector, folder, failures);
-    bool killed = false;
-    try {
-      const StopAtStep stop(step);
-      GetParam().run(*selector, failures);
-    } catch (const Killed &) {
-      killed = true;
-    }
-    if (killed && recoveryStep > 0) {
-      try {
-        const StopAtStep stop(recoveryStep);
-        Start();
-        killed = false;
-      } catch (const Killed &) {
-      }
-    }
+    bool killed = KilledAt(step, [this] {
+      if (GetParam().click)
+        ClickFolder(*selector, GetParam().click, failures);
+      else
+        Gathered(selector->ResetAll(selector->ResetAllFiles(failures)), failures);
+    });
+    if (killed && recoveryStep > 0)
+      killed = KilledAt(recoveryStep, [this] { Start(); });
     Start();
     return killed;
   }
@@ -116,8 +101,7 @@ protected:
   // provides it, else the game's own file, else nothing; record and ledger agree, no journal and
   // no temporary file is left.
   void ExpectAsTheLedgerSays(const std::string &where) {
-    Failures ignored;
-    const Ledger ledger = Ledger::Read(game->Library() / kKeepingFolder, ignored);
+    const Ledger ledger = Ledger::Read(game->Library() / kKeepingFolder, failures);
     Files expected = kOwn;
     std::set<std::string> loaded;
     for (const LoadedFolder &folder : ledger.Folders()) {
@@ -125,12 +109,13 @@ protected:
       for (const auto &[path, bytes] : kFolders.at(folder.name))
         expected[path] = bytes;
     }
+    Files found;
     for (const auto &[folder, files] : kFolders)
-      for (const auto &[path, bytes] : files) {
-        const std::string found = game->Exists(path) ? game->Read(path) : "(none)";
-        EXPECT_EQ(found, expected.count(path) ? expected[path] : "(none)") << path << where;
-      }
-    const std::vector<std::string> names = ReadLoadedNames(LibraryFor(game->Path()), ignored);
+      for (const auto &[path, bytes] : files)
+        if (game->Exists(path))
+          found[path] = game->Read(path);
+    EXPECT_EQ(found, expected) << where;
+    const std::vector<std::string> names = ReadLoadedNames(LibraryFor(game->Path()), failures);
     EXPECT_EQ(std::set<std::string>(names.begin(), names.end()), loaded) << where;
     EXPECT_FALSE(game->Exists("ZEP128/#Selector/journal.txt")) << where;
     for (const auto &entry : fs::recursive_directory_iterator(game->Path()))
@@ -142,6 +127,8 @@ protected:
   NotingStarter starter;
   std::unique_ptr<Selector> selector;
   Failures failures;
+  std::string oldTemporary;
+  int stepsLeft = 0;
 };
 
 } // namespace
@@ -155,17 +142,13 @@ TEST_P(CrashSteps, EveryKillLeavesTheGameAsTheLedgerSays) {
   ExpectAsTheLedgerSays(" (not killed)");
 }
 
-INSTANTIATE_TEST_SUITE_P(
-    Operations, CrashSteps,
-    ::testing::Values(Operation{"LoadKeepingOriginals", {}, Clicks("N-A")},
-                      Operation{"LoadOverAnother", {"N-A"}, Clicks("N-B")},
-                      Operation{"UnloadPuttingOriginalsBack", {"N-A"}, Clicks("N-A")},
-                      Operation{"UnloadOfASharedFile", {"N-A", "N-B"}, Clicks("N-A")},
-                      Operation{"LoadOfTheOtherOfALetter", {"S-X"}, Clicks("S-Y")},
-                      Operation{"ResetAll",
-                                {"N-A", "N-B", "S-X"},
-                                [](Selector &selector, Failures &failures) {
-                                  Gathered(selector.ResetAll(selector.ResetAllFiles(failures)),
-                                           failures);
-                                }}),
-    [](const ::testing::TestParamInfo<Operation> &info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Operations, CrashSteps,
+                         ::testing::Values(Operation{"LoadKeepingOriginals", {}, "N-A"},
+                                           Operation{"LoadOverAnother", {"N-A"}, "N-B"},
+                                           Operation{"UnloadPuttingOriginalsBack", {"N-A"}, "N-A"},
+                                           Operation{"UnloadOfASharedFile", {"N-A", "N-B"}, "N-A"},
+                                           Operation{"LoadOfTheOtherOfALetter", {"S-X"}, "S-Y"},
+                                           Operation{"ResetAll", {"N-A", "N-B", "S-X"}, nullptr}),
+                         [](const ::testing::TestParamInfo<Operation> &info) {
+                           return std::string(info.param.name);
+                         });

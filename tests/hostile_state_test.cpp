@@ -4,10 +4,12 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <random>
 #include <sstream>
 
 namespace fs = std::filesystem;
+using namespace std::string_literals;
 
 namespace {
 
@@ -25,10 +27,10 @@ protected:
       outer.Write(file, "outside");
     before = Snapshot(outer.Path(), "game");
   }
-  // Writes the program's file `relative` of the game folder; with both folders recorded loaded.
-  void WriteState(const std::string &relative, const std::string &bytes) const {
+  // Writes the program's own file `name`; with both folders recorded loaded.
+  void WriteState(const std::string &name, const std::string &bytes) const {
     outer.Write("game/ZEP128/FoldersLoaded.txt", "N-One\r\nN-Two\r\n");
-    outer.Write("game/" + relative, bytes);
+    outer.Write("game/ZEP128/#Selector/" + name, bytes);
   }
   // Starts the program, unloads every loaded folder and resets all.
   void StartAndUnloadAll() {
@@ -51,13 +53,12 @@ protected:
   Failures failures;
 };
 
-// A line of one of the program's files that takes a name, and what the name aims at outside.
+// A line of one of the program's files that takes a name, and the name that aims outside from
+// where it is taken.
 struct StateLine {
   const char *file;
   const char *before; // the file up to the name
-  int line;
-  const char *up; // from where the name is taken up to the larger folder
-  const char *aim;
+  std::string aim;
 };
 
 class HostileName : public OuterGame, public ::testing::WithParamInterface<StateLine> {};
@@ -66,29 +67,27 @@ class HostileName : public OuterGame, public ::testing::WithParamInterface<State
 
 TEST_P(HostileName, IsRefusedWithItsFileAndLineAndTouchesNothingOutside) {
   const StateLine &state = GetParam();
+  const std::string line = std::to_string(1 + std::ranges::count(std::string(state.before), '\n'));
   for (const std::string &name :
-       {std::string(state.up) + state.aim, Absolute(state.aim), std::string("nul.txt")}) {
+       {state.aim, Absolute(state.aim.substr(state.aim.find_first_not_of("./"))), "nul.txt"s}) {
     // A music journal acts only when the game has no music folder.
     fs::remove_all(game / "Music");
     WriteState(state.file, state.before + name + "\r\n");
     StartAndUnloadAll();
     EXPECT_EQ(Snapshot(outer.Path(), "game"), before) << name;
-    const std::string refusal =
-        DisplayPath(game / state.file) + ": line " + std::to_string(state.line) + " was ignored";
-    EXPECT_NE(failures.Message("").find(refusal), std::string::npos) << failures.Message("");
+    EXPECT_TRUE(Contains(failures.Message(""), DisplayPath(game / "ZEP128/#Selector" / state.file) +
+                                                   ": line " + line + " was ignored"));
     failures = {};
   }
 }
 
 INSTANTIATE_TEST_SUITE_P(
     StateFiles, HostileName,
-    ::testing::Values(
-        StateLine{"ZEP128/#Selector/journal.txt", "unload\r\nN-One\r\n\tG-", 3, "../",
-                  "outside/victim.dat"},
-        StateLine{"ZEP128/#Selector/journal.txt", "load\r\n", 2, "../../", "outside"},
-        StateLine{"ZEP128/#Selector/loaded.txt", "N-One\r\n\tG ", 2, "../", "outside/victim.dat"},
-        StateLine{"ZEP128/#Selector/loaded.txt", "", 1, "../../", "outside"},
-        StateLine{"ZEP128/#Selector/music.txt", "Music\r\nSet1\r\n", 3, "../", "outside/victim"}));
+    ::testing::Values(StateLine{"journal.txt", "unload\r\nN-One\r\n\tG-", "../outside/victim.dat"},
+                      StateLine{"journal.txt", "load\r\n", "../../outside"},
+                      StateLine{"loaded.txt", "N-One\r\n\tG ", "../outside/victim.dat"},
+                      StateLine{"loaded.txt", "", "../../outside"},
+                      StateLine{"music.txt", "Music\r\nSet1\r\n", "../outside/victim"}));
 
 TEST_F(OuterGame, RandomStateFilesTouchNothingOutsideTheGameFolder) {
   // Pieces of names, between "|": the first seven aim outside the game folder; the others are
@@ -103,30 +102,27 @@ TEST_F(OuterGame, RandomStateFilesTouchNothingOutsideTheGameFolder) {
   pieces.insert(pieces.end(), {std::string(1, '\0'), std::string(300, 'x')});
   std::mt19937 random(18);
   const auto pick = [&](size_t count) { return random() % count; };
-  // Half the names aim outside whole; the others join one to three pieces of any kind.
-  const auto name = [&] {
+  // A name and its line end: half aim outside whole; the others join one to three pieces.
+  const auto nameLine = [&] {
     std::string text = pick(2) ? pieces[pick(7)] : "";
     for (size_t count = text.empty() ? 1 + pick(3) : 0; count > 0; --count)
       text += pieces[pick(pieces.size())];
-    return text;
+    return text + "\r\n";
   };
   const auto fileLines = [&](size_t count) {
     std::string text;
     for (; count > 0; --count)
-      text += std::string("\t") + "GGSMX"[pick(5)] + "+- "[pick(3)] + name() + "\r\n";
+      text += std::string("\t") + "GGSMX"[pick(5)] + "+- "[pick(3)] + nameLine();
     return text;
   };
-  const char *steps[] = {"load", "loaded", "unload", "reset", "restore"};
+  const std::string steps[] = {"load\r\n", "loaded\r\n", "unload\r\n", "reset\r\n", "restore\r\n"};
   for (int round = 0; round < 40; ++round) {
     if (pick(2) == 0)
       fs::remove_all(game / "Music");
-    WriteState("ZEP128/#Selector/journal.txt",
-               std::string(steps[pick(5)]) + "\r\n" + name() + "\r\n" + fileLines(pick(6)));
-    WriteState("ZEP128/#Selector/loaded.txt", "N-One\r\n" + fileLines(pick(4)) + name() + "\r\n" +
-                                                  fileLines(pick(4)) + "N-Two\r\n" +
-                                                  fileLines(pick(4)));
-    WriteState("ZEP128/#Selector/music.txt",
-               (pick(2) ? "Music\r\n" : name() + "\r\n") + name() + "\r\n" + name() + "\r\n");
+    WriteState("journal.txt", steps[pick(5)] + nameLine() + fileLines(pick(6)));
+    WriteState("loaded.txt", "N-One\r\n" + fileLines(pick(4)) + nameLine() + fileLines(pick(4)) +
+                                 "N-Two\r\n" + fileLines(pick(4)));
+    WriteState("music.txt", (pick(2) ? "Music\r\n" : nameLine()) + nameLine() + nameLine());
     StartAndUnloadAll();
     ASSERT_EQ(Snapshot(outer.Path(), "game"), before) << "round " << round;
   }
