@@ -4,8 +4,6 @@
 #include "base/file_ops.h"
 #include "base/names.h"
 #include "library/loaded_record.h"
-#include "library/move_in.h"
-#include "library/move_out.h"
 #include "library/reset_all.h"
 #include "settings/eaw_ini.h"
 #include "tests/selector_fixture.h"
@@ -15,8 +13,6 @@
 #include <gtest/gtest.h>
 
 #include <memory>
-
-namespace fs = std::filesystem;
 
 namespace {
 
@@ -37,16 +33,9 @@ Held HoldOpen(const fs::path &path) {
           &CloseHandle};
 }
 
-class WindowsFiles : public ::testing::Test {
+class WindowsFiles : public LibraryTest {
 protected:
-  void Load(const std::string &name) { MoveIn(state, game.Library() / name, caption, failures); }
-  void Unload(const std::string &name) { MoveOut(state, game.Library() / name, caption, failures); }
   fs::path InGame(const std::string &name) const { return game.Path() / name; }
-
-  GameFolder game;
-  LibraryState state = LibraryFor(game.Path());
-  RecordingCaption caption;
-  Failures failures;
 };
 
 using WindowsNames = SelectorTest;
@@ -77,7 +66,6 @@ TEST_F(WindowsFiles, ReadOnlyHiddenAndSystemFilesAreReplacedAndDeleted) {
   // The game's own file was kept like any other, and is back hidden and system as it was.
   EXPECT_EQ(game.Read("planes.dat"), "the game's");
   EXPECT_EQ(WhichOf(kHiddenSystem, InGame("planes.dat")), kHiddenSystem);
-  EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
 // Wine lets a file be renamed over a read-only one, which Windows refuses: under Wine this test
@@ -102,7 +90,6 @@ TEST_F(WindowsFiles, ReadOnlyFilesAreReplacedOrDeletedAndHiddenOnesKept) {
   inisave(game.Path(), {"640"}, failures);
   EXPECT_EQ(game.Read("eaw.ini"), "Width=640\r\n");
   EXPECT_EQ(WhichOf(kReadOnly | kHiddenSystem, InGame("eaw.ini")), kHiddenSystem);
-  EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
 TEST_F(WindowsFiles, ASourceHeldOpenLeavesTheFilesItWouldReplaceAsTheyWere) {
@@ -114,7 +101,7 @@ TEST_F(WindowsFiles, ASourceHeldOpenLeavesTheFilesItWouldReplaceAsTheyWere) {
   EXPECT_FALSE(CopyJournaled(InGame("source.dat"), InGame("free.dat"), failures));
   EXPECT_EQ(game.Read("target.dat"), "old");
   EXPECT_TRUE(game.None({"free.dat", "target.dat.partial"}));
-  EXPECT_EQ(failures.Lines().size(), 2u);
+  EXPECT_EQ(Taken().Lines().size(), 2u);
 }
 
 TEST_F(WindowsFiles, AFileHeldOpenIsSkippedNamedAndLeftAsItWas) {
@@ -129,7 +116,7 @@ TEST_F(WindowsFiles, AFileHeldOpenIsSkippedNamedAndLeftAsItWas) {
     EXPECT_EQ(game.Read("free.dat"), "free.dat");
     EXPECT_FALSE(game.Exists("held.dat.partial"));
     ASSERT_TRUE(OneFailure(failures, kInUse));
-    EXPECT_TRUE(Contains(failures.Lines()[0], "held.dat"));
+    EXPECT_TRUE(Contains(Taken().Lines()[0], "held.dat"));
   }
   EXPECT_EQ(game.Read("held.dat"), "the game's");
 
@@ -162,11 +149,10 @@ TEST_F(WindowsNames, MusicSetsWithTrailingBlanksAndDotsFindTheirFolders) {
   game.Write("Set2/two.bgm");
   game.Write("Music/three.bgm");
   const MusicList music = selector->MusicSets(failures);
-  EXPECT_EQ(music.entries, (std::vector<std::string>{"Set1 ", "Set2."}));
+  EXPECT_EQ(music.entries, (Names{"Set1 ", "Set2."}));
   EXPECT_EQ(music.current, "Set3");
   EXPECT_TRUE(Gather(selector->SwitchMusic("Set3", "Set1 ")).done);
   EXPECT_TRUE(game.All({"Music/one.bgm", "Set3/three.bgm"}));
-  EXPECT_TRUE(failures.Empty()) << failures.Message("");
 }
 
 TEST_F(WindowsFiles, PathsAreShownWithWindowsSeparators) {
@@ -176,6 +162,6 @@ TEST_F(WindowsFiles, PathsAreShownWithWindowsSeparators) {
   // The game folder as Qt hands it over, with "/" between names.
   state = LibraryFor(fs::path(game.Path()).generic_wstring());
   MoveIn(state, state.LibDir / "S-One", caption, failures);
-  ASSERT_EQ(failures.Lines().size(), 1u);
-  EXPECT_EQ(failures.Lines()[0].find('/'), std::string::npos) << failures.Lines()[0];
+  ASSERT_TRUE(OneFailure(failures, "one.dat"));
+  EXPECT_EQ(Taken().Lines()[0].find('/'), std::string::npos);
 }

@@ -7,8 +7,6 @@
 #include <sstream>
 #include <sys/stat.h>
 
-namespace fs = std::filesystem;
-
 namespace {
 
 // Where the source of a copy lies, and which way the copy is then expected to take.

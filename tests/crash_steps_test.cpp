@@ -12,8 +12,6 @@
 #include <memory>
 #include <set>
 
-namespace fs = std::filesystem;
-
 namespace {
 
 using Files = std::map<std::string, std::string>; // game path -> bytes

@@ -8,7 +8,6 @@
 #include <random>
 #include <sstream>
 
-namespace fs = std::filesystem;
 using namespace std::string_literals;
 
 namespace {
