@@ -160,8 +160,8 @@ TEST_F(Keeping, ACopyThatCannotBeDeletedStaysListedIsTriedAgainAndIsNoOriginal) 
 TEST_F(Keeping, AnOldRecordGivesTheLedgerOnceAndTheLedgerWinsAtEveryStart) {
   game.Addon("S-X", {"x.dat"});
   game.Addon("S-Y", {"y.dat"});
-  for (const char *copy : {"x.dat", "y.dat"})
-    game.Write(copy, copy);
+  game.Write("x.dat");
+  game.Write("y.dat");
   game.Write("sky.spt", "N-A");
   game.WithRecord("N-A\r\nS-X\r\nS-Y\r\n\r\n");
   Restart();

@@ -26,9 +26,7 @@ TEST_F(Refusals, FoldersTheGameNeedsAreNoMusicSets) {
   EXPECT_EQ(music.current, "Set2");
   EXPECT_FALSE(Gather(selector->SwitchMusic("Set2", "zep128")).done);
   EXPECT_FALSE(Gather(selector->SwitchMusic("Savedata", "Set1")).done);
-  EXPECT_TRUE(game.Exists("ZEP128/zep.ini"));
-  EXPECT_TRUE(game.Exists("Savedata/a.sve"));
-  EXPECT_TRUE(game.Exists("Music/b.bgm"));
+  EXPECT_TRUE(game.All({"ZEP128/zep.ini", "Savedata/a.sve", "Music/b.bgm"}));
   const std::string refused = Taken().Message("");
   EXPECT_TRUE(Contains(refused, "\"zep128\" is a folder the game or this program needs"));
   EXPECT_TRUE(Contains(refused, "\"Savedata\" is a folder"));

@@ -42,9 +42,8 @@ TEST_F(ResetAll, DeletesAddOnFilesEmptiesTheRecordAndUnmarksEveryRow) {
     ::ResetAll(state, CleanUpNames(state, failures), caption, failures);
     EXPECT_EQ(ListFiles(game.Path()), (Names{"a.tmx", "chatline.txt", "dsg.ico", "eaw.exe",
                                              "Extra.Spt", "hof.dat", "mypicture", "title.bmp"}));
-    for (const char *kept : {"Savedata/a.dat", "old.dat/inside.txt", "ZEP128/S-Camo/a.txt"})
-      EXPECT_TRUE(game.Exists(kept)) << kept;
-    EXPECT_TRUE(game.Exists("ZEP128/FoldersLoaded.txt"));
+    EXPECT_TRUE(game.All({"Savedata/a.dat", "old.dat/inside.txt", "ZEP128/S-Camo/a.txt",
+                          "ZEP128/FoldersLoaded.txt"}));
     EXPECT_EQ(game.Record(), "");
   }
   EXPECT_EQ(caption.shown.front(), "Please wait... cleaning up");
@@ -69,7 +68,6 @@ TEST_F(ResetAll, AFileThatCannotBeDeletedIsSkippedAndNamed) {
   fs::remove(game.Path() / "pic1.bmp");
   game.Write("pic1.bmp/keep.txt");
   ::ResetAll(state, names, caption, failures);
-  EXPECT_FALSE(game.Exists("mypic"));
-  EXPECT_FALSE(game.Exists("readme.txt"));
+  EXPECT_TRUE(game.None({"mypic", "readme.txt"}));
   EXPECT_TRUE(OneFailure(Taken(), "pic1.bmp"));
 }
