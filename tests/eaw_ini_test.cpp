@@ -24,28 +24,22 @@ Shown Read(const TestFolder &game) {
 using EawIni = GameTest;
 using IniEditor = GameTest;
 
-TEST_F(EawIni, TheLastLineOfAKeyIsShownAndEveryLineOfItRewritten) {
-  game.Write("eaw.ini", kIni);
-  EXPECT_EQ(Read(game), (Shown{"1024", "600", std::nullopt, "0", "0", "16"}));
-  inisave(game.Path(), kTexts, failures);
-  EXPECT_EQ(game.Read("eaw.ini"), "[Screen]\r\nWidth=1280\r\nHeight=\r\n Width=5\r\nwidth=6\r\n"
-                                  "[Game]\r\nDay=12\r\nWidth=1280\r\nMonth=abc\r\n"
-                                  "PlaneSetNumber=2\r\n");
-}
-
-TEST_F(EawIni, WritesAReadOnlyFileButNeverDamagesIt) {
+TEST_F(EawIni, TheLastLineOfAKeyIsShownEveryLineRewrittenAndTheFileNeverDamaged) {
   inisave(game.Path(), kTexts, failures);
   EXPECT_FALSE(game.Exists("eaw.ini"));
-  SetReadOnly(game.Write("eaw.ini", "Width=1\r\n"), true);
+  SetReadOnly(game.Write("eaw.ini", kIni), true);
+  EXPECT_EQ(Read(game), (Shown{"1024", "600", std::nullopt, "0", "0", "16"}));
   inisave(game.Path(), kTexts, failures);
-  EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\n");
+  const std::string saved = game.Read("eaw.ini");
+  EXPECT_EQ(saved, "[Screen]\r\nWidth=1280\r\nHeight=\r\n Width=5\r\nwidth=6\r\n"
+                   "[Game]\r\nDay=12\r\nWidth=1280\r\nMonth=abc\r\nPlaneSetNumber=2\r\n");
   EXPECT_TRUE(IsWritable(game.Path() / "eaw.ini"));
   EXPECT_TRUE(failures.Empty());
 
   game.Write("eaw.ini.partial/in the way");
   inisave(game.Path(), {"640"}, failures);
   EXPECT_FALSE(IniEditorSave(game.Path(), "Width=2", failures));
-  EXPECT_EQ(game.Read("eaw.ini"), "Width=1280\r\n");
+  EXPECT_EQ(game.Read("eaw.ini"), saved);
   EXPECT_TRUE(Contains(Taken().Message(""), "eaw.ini"));
 }
 

@@ -124,7 +124,7 @@ TEST(TextEncoding, WindowsTextBecomesUtf8AndGoesBackByteForByte) {
   EXPECT_EQ(TextAsUtf8("\xE4"), "\xC3\xA4");
 }
 
-TEST(NameCase, LettersBeyondAsciiFoldToTheSameName) {
+TEST(NameCase, LettersBeyondAsciiFoldToTheSameNameAndAreFoundSo) {
   // clang-format off
   const std::pair<const char *, const char *> same[] = {
       {"ärmel.dat", "ÄRMEL.DAT"}, {"Été", "éTÉ"}, {"άλφα", "ΆΛΦΑ"}, {"жук", "ЖУК"},
@@ -133,11 +133,10 @@ TEST(NameCase, LettersBeyondAsciiFoldToTheSameName) {
   for (const auto &[a, b] : same)
     EXPECT_EQ(FoldName(a), FoldName(b)) << a;
   EXPECT_NE(FoldName("ärmel"), FoldName("armel"));
-}
 
-TEST(NameCase, AFolderIndexFindsEachFileThatFoldsLikeAWantedName) {
-  // The Kelvin sign and the long s fold to ASCII letters of fewer bytes where Unicode folding
-  // applies, so their names are no guide to their folded length or first letter.
+  // A folder's index finds each file that folds like a wanted name. The Kelvin sign and the long s
+  // fold to ASCII letters of fewer bytes where Unicode folding applies, so their names are no guide
+  // to their folded length or first letter.
   TestFolder folder;
   for (const char *name :
        {"\xE2\x84\xAA.dat", "\xC5\xBF.dat", "k.DAT", "s.dat", "\xC3\x84rmel.dat", "armel.dat"})
