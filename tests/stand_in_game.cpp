@@ -11,9 +11,10 @@ int main() {
   std::wstring self(MAX_PATH, L'\0');
   self.resize(GetModuleFileNameW(nullptr, self.data(), static_cast<DWORD>(self.size())));
   const std::filesystem::path folder = std::filesystem::path(self).parent_path();
-  if (!std::ofstream(folder / ("started-" + std::to_string(GetCurrentProcessId()))))
-    return 1;
+  // The status is read first: once the test sees the file, it may write another status.
   int status = 0;
   std::ifstream(folder / "exit-status") >> status;
+  if (!std::ofstream(folder / ("started-" + std::to_string(GetCurrentProcessId()))))
+    return 1;
   return status;
 }

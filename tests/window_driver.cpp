@@ -75,10 +75,11 @@ testing::AssertionResult WindowDriver::OneMessage(std::initializer_list<QString>
 }
 
 void MakeStandInGame(GameFolder &game, int status) {
-  namespace fs = std::filesystem;
 #ifdef _WIN32
+  // Windows keeps a running program's file from being replaced, and one started earlier may
+  // still run: the program stays, and only its status changes.
   fs::copy_file(ToPath(QCoreApplication::applicationDirPath()) / "stand_in_game.exe",
-                game.Path() / "eaw.exe", fs::copy_options::overwrite_existing);
+                game.Path() / "eaw.exe", fs::copy_options::skip_existing);
   game.Write("exit-status", std::to_string(status));
 #else
   const fs::path exe =
