@@ -71,6 +71,7 @@ protected:
   // (0 for none) and the recovery then at `recoveryStep`.
   bool KillAt(int step, int recoveryStep) {
     game = std::make_unique<GameFolder>();
+    failures = {};
     game->WithGameFolders().WithCategories("Sounds: N\r\nSkins: S\r\n");
     for (const auto &[folder, files] : kFolders)
       for (const auto &[path, bytes] : files)
@@ -118,6 +119,8 @@ protected:
     EXPECT_FALSE(game->Exists("ZEP128/#Selector/journal.txt")) << where;
     for (const auto &entry : fs::recursive_directory_iterator(game->Path()))
       EXPECT_NE(entry.path().extension(), ".partial") << entry.path() << where;
+    // The recovery finishes or undoes the operation without a word: nothing needs mending.
+    EXPECT_TRUE(failures.Empty()) << failures.Message("") << where;
   }
 
   std::unique_ptr<GameFolder> game;
